@@ -1,0 +1,18 @@
+# Settings that every target built here shares: warnings, sanitizers and reproducible file names.
+
+function(hmi_target_defaults target)
+    set_target_properties(${target} PROPERTIES
+        AUTOMOC ON
+        CXX_EXTENSIONS OFF
+        CXX_STANDARD_REQUIRED ON)
+    target_compile_options(${target} PRIVATE
+        -Wall -Wextra -Wpedantic -Wshadow -Woverloaded-virtual
+        $<$<BOOL:${HMISTATEMACHINE_WERROR}>:-Werror>
+        # Messages carry the file name of the source as it stands in the project, wherever it was built.
+        -fmacro-prefix-map=${PROJECT_SOURCE_DIR}/=)
+    if(HMISTATEMACHINE_SANITIZE)
+        target_compile_options(${target} PRIVATE
+            -fsanitize=${HMISTATEMACHINE_SANITIZE} -fno-sanitize-recover=all -fno-omit-frame-pointer)
+        target_link_options(${target} PRIVATE -fsanitize=${HMISTATEMACHINE_SANITIZE})
+    endif()
+endfunction()
