@@ -1,0 +1,86 @@
+#pragma once
+
+#include <HmiStateMachine/hmistatemachine_export.h>
+#include <HmiStateMachine/named/namedtargettransitionbase.h>
+
+#include <QList>
+#include <QPointer>
+#include <QSignalTransition>
+#include <QVariant>
+
+namespace HmiStateMachine {
+
+/**
+ * The library's signal transition; named states accept no other kind.
+ *
+ * It can be blocked, and tells the arguments of the signal that fired it by
+ * triggeredWithArguments(). A sender that is destroyed leaves the transition without one.
+ */
+class HMISTATEMACHINE_EXPORT HmiSignalTransition : public QSignalTransition,
+                                                   public NamedTargetTransitionBase
+{
+    Q_OBJECT
+
+public:
+    explicit HmiSignalTransition(QState *sourceState = nullptr);
+
+    /** @p signal is written with SIGNAL(). */
+    HmiSignalTransition(const QObject *sender, const char *signal, QState *sourceState = nullptr);
+    ~HmiSignalTransition() override;
+
+    /**
+     * A blocked transition never fires. It still counts in its sibling groups, where it takes the
+     * event from those of lower priority.
+     */
+    bool blocked() const;
+    void setBlocked(bool blocked);
+
+    /**
+     * Joins the group of all transitions for the same sender and signal. False when the priority is
+     * taken, or when this transition has another one already.
+     */
+    bool makeParallelExclusive(int priority);
+
+protected:
+    bool eventTest(QEvent *event) override;
+    void onTransition(QEvent *event) override;
+
+public:
+    QState *getSourceState() const override;
+    void changeTarget(QState *target) override;
+    QAbstractState *getTarget() const override;
+    bool internalEventTest(QEvent *event) override;
+
+    /** HmiState::addHmiTransition() has made @p state the source; does nothing here. */
+    virtual void sourceStateChange(QState *state);
+
+Q_SIGNALS:
+    /** Follows each firing, before the target is entered. */
+    void triggeredWithArguments(QVariantList triggerArguments);
+
+private:
+    Q_DISABLE_COPY(HmiSignalTransition)
+
+    friend class TriggerFunctor;
+
+    void followSender();
+    void forgetSender();
+
+    QList<QVariant> m_triggerArguments;
+    bool m_blocked = false;
+    QMetaObject::Connection m_senderDestroyed;
+};
+
+/** Emits a transition's triggeredWithArguments() when it is called; nothing once that is gone. */
+class HMISTATEMACHINE_EXPORT TriggerFunctor
+{
+public:
+    explicit TriggerFunctor(HmiSignalTransition *transition);
+
+    void operator()() const;
+
+private:
+    QPointer<HmiSignalTransition> m_transition;
+};
+
+} // namespace HmiStateMachine

@@ -1,0 +1,73 @@
+#pragma once
+
+#include <HmiStateMachine/hmistatemachine_export.h>
+#include <HmiStateMachine/named/namedstate.h>
+
+namespace HmiStateMachine {
+
+/**
+ * Base of the states of a screen flow.
+ *
+ * Each entry writes a marker for measuring screen changes and tells the view layer whether popups
+ * are on. The popup behaviour is inherited: a state starts with that of its parent and follows it
+ * until it is given another one of its own.
+ */
+class HMISTATEMACHINE_EXPORT HmiState : public NamedState
+{
+    Q_OBJECT
+
+public:
+    /** Any other value is kept and inherited, and announces nothing on entry. */
+    enum PopupBehavior : int {
+        DefaultPopupBehavior = 0, ///< entry resets the view layer's popup behaviour
+        PopupBehaviorOff = 1, ///< entry switches popups off
+        PopupBehaviorOn = 2 ///< entry switches popups on
+    };
+
+    explicit HmiState(const QString &name, QState *parent = nullptr);
+    explicit HmiState(QState *parent = nullptr);
+    ~HmiState() override;
+
+    /**
+     * A state that carries @p name without entering it into the registry, so that many states may
+     * have it. Owned by @p parent, or by the caller when that is null.
+     */
+    static HmiState *createWithoutHashing(const QString &name, QState *parent);
+
+    PopupBehavior popupBehavior() const;
+
+    /** Adds @p t, and lets a signal transition know its new source. */
+    void addHmiTransition(QAbstractTransition *t);
+
+public Q_SLOTS:
+    /**
+     * Gives the state a behaviour of its own. A change cuts the inheritance from the parent for
+     * good; the value it has already changes nothing.
+     */
+    void setPopupBehavior(PopupBehavior behavior);
+
+    /** Takes over the behaviour of the parent. */
+    void syncPopupBehavior(PopupBehavior behavior);
+
+Q_SIGNALS:
+    /** Only on a real change, after the value is stored. */
+    void popupBehaviorChanged(PopupBehavior arg);
+
+protected:
+    void onEntry(QEvent *event) override;
+    void onExit(QEvent *event) override;
+
+public:
+    /** The initial state, for states that run more than one layer. */
+    virtual void setInitialHmiState(QState *state);
+    virtual QAbstractState *initialHmiState() const;
+
+private:
+    Q_DISABLE_COPY(HmiState)
+
+    void inheritPopupBehavior(QState *parent);
+
+    PopupBehavior m_popupBehavior = DefaultPopupBehavior;
+};
+
+} // namespace HmiStateMachine

@@ -1,0 +1,7 @@
+#include <HmiStateMachine/hmi/hmitargetfilter.h>
+
+namespace HmiStateMachine {
+
+HmiTargetFilter::~HmiTargetFilter() = default;
+
+}

@@ -1,0 +1,7 @@
+#include <HmiStateMachine/internal/logging.h>
+
+HmiLoggingCategory &hmistatemachine()
+{
+    static HmiLoggingCategory category("vosk.hmistatemachine", 1);
+    return category;
+}

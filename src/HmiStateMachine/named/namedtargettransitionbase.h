@@ -1,0 +1,95 @@
+#pragma once
+
+#include <HmiStateMachine/hmistatemachine_export.h>
+
+#include <QList>
+#include <QPointer>
+#include <QString>
+#include <QVariant>
+#include <QVector>
+
+class QAbstractState;
+class QEvent;
+class QState;
+
+namespace HmiStateMachine {
+
+class ParallelSiblingTransitionGroup;
+
+/**
+ * What every transition of the library carries beside its Qt base: a target that is named by a
+ * string, membership in sibling groups, a record of the transitions that are just firing, and the
+ * mark of a voice request.
+ *
+ * Belongs to the thread of the machine.
+ */
+class HMISTATEMACHINE_EXPORT NamedTargetTransitionBase
+{
+public:
+    NamedTargetTransitionBase() = default;
+
+    /** Leaves the list of firing transitions and all sibling groups. */
+    virtual ~NamedTargetTransitionBase();
+
+    virtual QState *getSourceState() const = 0;
+    virtual void changeTarget(QState *target) = 0;
+    virtual QAbstractState *getTarget() const = 0;
+
+    /**
+     * The transition's own test of @p event, guard included, without the sibling groups. Asked by
+     * groups on behalf of other members too, so it may run several times for one event.
+     */
+    virtual bool internalEventTest(QEvent *event);
+
+    /**
+     * Makes the state registered under @p name the target. The name is looked up now; when it is
+     * empty or unknown the transition is left without a target.
+     */
+    void setNamedTargetState(const QString &name);
+
+    /** The target's present name; empty without a target, or when it is no NamedState. */
+    QString targetName() const;
+
+    /** Marks the transition as caused by a voice request; handed to the view layer when it fires.
+     */
+    void setIsVREventTransition(bool isVR, const QVariant &data);
+    bool isVREventTransition() const;
+    QVariant vrEventData() const;
+
+    /** Lists the transition as about to fire. A transition without a target is never listed. */
+    void aboutToBeTriggered();
+
+    /** Takes the transition off that list. */
+    void wasTriggered();
+
+    /**
+     * The transitions that passed their event test and have not fired yet. During the source's
+     * onExit() the one that carries the machine away is among them; others that Qt tested and did
+     * not take may be too, until they fire or are destroyed.
+     */
+    static QList<NamedTargetTransitionBase *> triggeringTransition();
+
+    /** True when a sibling of higher priority takes @p event in place of this transition. */
+    bool activeSiblingTest(QEvent *event);
+
+protected:
+    /** The common event test: own test, then siblings, then listed as about to fire. */
+    bool arbitratedEventTest(QEvent *event);
+
+    /** The common end of a firing: off the list, then the voice request is passed on. */
+    void finishTransition();
+
+private:
+    Q_DISABLE_COPY(NamedTargetTransitionBase)
+
+    friend class ParallelSiblingTransitionGroup;
+
+    bool wouldFireForEver(const QEvent *event);
+
+    QVector<QPointer<ParallelSiblingTransitionGroup>> m_siblingGroups;
+    bool m_isVREvent = false;
+    QVariant m_vrEventData;
+    bool m_warnedOfMissingTarget = false;
+};
+
+} // namespace HmiStateMachine

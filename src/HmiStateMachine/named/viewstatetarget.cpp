@@ -1,0 +1,57 @@
+#include <HmiStateMachine/named/viewstatetarget.h>
+
+#include <HmiStateMachine/internal/metatypes.h>
+
+namespace HmiStateMachine {
+
+// Here too: a static library is linked without the states when only this class is used.
+Q_CONSTRUCTOR_FUNCTION(registerMetaTypes)
+
+ViewStateTarget *ViewStateTarget::VIEW_STATE_TARGET_INSTANCE = nullptr;
+
+ViewStateTarget::ViewStateTarget(QObject *parent) : QObject(parent)
+{
+}
+
+ViewStateTarget::~ViewStateTarget() = default;
+
+ViewStateTarget *ViewStateTarget::instance()
+{
+    return VIEW_STATE_TARGET_INSTANCE;
+}
+
+void ViewStateTarget::stackPopup(const QString &popupId, const QString &stackingPopupId)
+{
+    Q_UNUSED(stackingPopupId)
+    if (!m_stackedPopups.contains(popupId)) {
+        m_stackedPopups.append(popupId);
+    }
+}
+
+void ViewStateTarget::unstackPopup(const QString &popupId)
+{
+    m_stackedPopups.removeAll(popupId);
+}
+
+QList<QString> ViewStateTarget::stackedPopups() const
+{
+    return m_stackedPopups;
+}
+
+void ViewStateTarget::setVRViewRequest(bool request, const QVariant &data)
+{
+    m_vrViewRequest = request;
+    m_vrViewRequestData = data;
+}
+
+bool ViewStateTarget::vrViewRequest() const
+{
+    return m_vrViewRequest;
+}
+
+QVariant ViewStateTarget::vrViewRequestData() const
+{
+    return m_vrViewRequestData;
+}
+
+} // namespace HmiStateMachine
