@@ -276,7 +276,7 @@ void HmiViewState::pushBackStack(const QString &id)
 
 QString HmiViewState::popBackStack()
 {
-    const QString id = m_backStack.isEmpty() ? QString() : m_backStack.pop();
+    QString id = m_backStack.isEmpty() ? QString() : m_backStack.pop();
     Q_EMIT backStackPop();
     return id;
 }

@@ -201,11 +201,10 @@ void NamedState::setName(const Identifier &name)
     if (name == m_name) {
         return;
     }
-    const Identifier newName = name; // the caller may have handed in a reference to the name itself
     removeFromHash(m_name);
-    if (hash(newName, this)) {
-        m_name = newName;
-        setObjectName(newName);
+    if (hash(name, this)) {
+        m_name = name;
+        setObjectName(name);
     } else {
         m_name.clear();
     }

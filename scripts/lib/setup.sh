@@ -1,0 +1,56 @@
+# Sourced by the commands beside this folder: installs what they need and moves to the project.
+
+set -euo pipefail
+
+project_dir=$(cd "$(dirname "${BASH_SOURCE[0]}")/../.." && pwd)
+cd "$project_dir"
+
+say() {
+    printf '== %s\n' "$*"
+}
+
+fail() {
+    printf '%s: %s\n' "$(basename "$0")" "$*" >&2
+    exit 1
+}
+
+is_installed() {
+    [ "$(dpkg-query -W -f='${db:Status-Status}' "$1" 2>/dev/null)" = installed ]
+}
+
+# The command in front of apt-get: nothing for root, sudo where it asks no password.
+apt_prefix() {
+    if [ "$(id -u)" -eq 0 ]; then
+        printf 'env'
+    elif command -v sudo >/dev/null && sudo -n true 2>/dev/null; then
+        printf 'sudo'
+    else
+        return 1
+    fi
+}
+
+# Installs the Debian packages named, those that are missing.
+require_packages() {
+    if ! command -v dpkg-query >/dev/null || ! command -v apt-get >/dev/null; then
+        say "Not a Debian system: going on with what is installed. Needed are what Debian calls: $*"
+        return
+    fi
+    local missing=() package prefix
+    for package in "$@"; do
+        is_installed "$package" || missing+=("$package")
+    done
+    if [ ${#missing[@]} -eq 0 ]; then
+        return
+    fi
+    prefix=$(apt_prefix) || fail "these packages are missing and may not be installed by this user:
+    ${missing[*]}
+Install them as root, then run this again:
+    apt-get update && apt-get install --no-install-recommends ${missing[*]}"
+    say "Installing ${missing[*]}"
+    $prefix apt-get update -q
+    $prefix env DEBIAN_FRONTEND=noninteractive \
+        apt-get install -q -y --no-install-recommends "${missing[@]}"
+}
+
+# What every build needs.
+build_packages=(cmake ninja-build g++ ccache qtbase5-dev)

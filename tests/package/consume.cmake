@@ -1,0 +1,64 @@
+# Uses the library as another project does, in WORK_DIR, which is made anew.
+#
+# BUILD_DIR: install this build. STATIC, PLATFORM_LOGGING: build the library so first, and install
+# that. SUBPROJECT: add it as a subfolder instead.
+
+function(run)
+    execute_process(COMMAND ${ARGN} RESULT_VARIABLE result OUTPUT_VARIABLE output
+        ERROR_VARIABLE output)
+    if(NOT result EQUAL 0)
+        string(REPLACE ";" " " command "${ARGN}")
+        message(FATAL_ERROR "${command}\n${output}")
+    endif()
+    set(output "${output}" PARENT_SCOPE)
+endfunction()
+
+function(expect text)
+    if(NOT output MATCHES "${text}")
+        message(FATAL_ERROR "Expected \"${text}\" in:\n${output}")
+    endif()
+endfunction()
+
+file(REMOVE_RECURSE ${WORK_DIR})
+set(prefix ${WORK_DIR}/prefix)
+set(configure ${CMAKE_COMMAND} -G Ninja -DCMAKE_BUILD_TYPE=Debug
+    -DCMAKE_CXX_COMPILER=${CXX_COMPILER} -DCMAKE_CXX_COMPILER_LAUNCHER=${LAUNCHER})
+
+set(platform_logging "")
+if(PLATFORM_LOGGING)
+    # The stand-in, built as if it were the platform's own library.
+    run(${configure} -S ${CMAKE_CURRENT_LIST_DIR}/platformlogging -B ${WORK_DIR}/logging
+        -DSTANDIN_DIR=${SOURCE_DIR}/platform/standin -DCMAKE_INSTALL_PREFIX=${WORK_DIR}/platform)
+    run(${CMAKE_COMMAND} --build ${WORK_DIR}/logging --target install)
+    set(platform_logging -DHmiLogging_ROOT=${WORK_DIR}/platform)
+endif()
+
+if(STATIC)
+    run(${configure} -S ${SOURCE_DIR} -B ${WORK_DIR}/library -DBUILD_SHARED_LIBS=OFF
+        -DHMISTATEMACHINE_BUILD_TESTS=OFF -DHMISTATEMACHINE_BUILD_EXAMPLES=OFF
+        -DHMISTATEMACHINE_WERROR=ON
+        -DHMISTATEMACHINE_PLATFORM_LOGGING=ON ${platform_logging})
+    expect("Logging: the platform's library \\(${WORK_DIR}/platform/lib/libHmiLogging")
+    run(${CMAKE_COMMAND} --build ${WORK_DIR}/library)
+    set(BUILD_DIR ${WORK_DIR}/library)
+endif()
+
+if(SUBPROJECT)
+    set(library -DHMISTATEMACHINE_SOURCE_DIR=${SOURCE_DIR} -DHMISTATEMACHINE_PLATFORM_LOGGING=OFF)
+else()
+    run(${CMAKE_COMMAND} --install ${BUILD_DIR} --prefix ${prefix})
+    set(library -DCMAKE_PREFIX_PATH=${prefix} -DVERSION=${VERSION})
+endif()
+
+run(${configure} -S ${CMAKE_CURRENT_LIST_DIR}/consumer -B ${WORK_DIR}/consumer
+    ${library} ${platform_logging})
+if(SUBPROJECT)
+    expect("Logging: the stand-in in platform/standin \\(HMISTATEMACHINE_PLATFORM_LOGGING=OFF\\)")
+endif()
+run(${CMAKE_COMMAND} --build ${WORK_DIR}/consumer)
+if(SUBPROJECT AND EXISTS ${WORK_DIR}/consumer/library/tests)
+    message(FATAL_ERROR "A subproject builds the library's tests")
+endif()
+set(ENV{QT_LOGGING_RULES} "*.debug=false")
+run(${WORK_DIR}/consumer/consumer)
+expect("^the radio is shown\n$")
