@@ -1,0 +1,3 @@
+hmi_add_test(hmi hmidelayedsignaltransition)
+set_property(TEST hmidelayedsignaltransition APPEND PROPERTY LABELS realtime)
+hmi_add_test(hmi hmisignaltransition)
