@@ -46,8 +46,9 @@ bool GuardedPropertyChangeTransition::internalEventTest(QEvent *event)
         return false;
     }
     const QVariant now = propertyValue();
-    // The machine and propertyChanged() listen to the same signal, in an order that changes with
-    // the entries of the source: a current value that is the new one already was recorded first.
+    // The machine and propertyChanged() listen to the same signal. The machine comes first when it
+    // was connected for an earlier transition already; otherwise the recorded current value is the
+    // new one by now, and the one before it counts.
     const QVariant &from =
         now == m_valueHistory.second ? m_valueHistory.first : m_valueHistory.second;
     if (!m_fromValues.isEmpty() && !m_fromValues.contains(from)) {
@@ -77,8 +78,7 @@ void GuardedPropertyChangeTransition::watchProperty(QState *sourceState)
                        sender, sourceState);
         return;
     }
-    // Connected by meta-method, because the signal is known at run time only. It comes before the
-    // machine's own connection, which is made when the source is entered.
+    // Connected by meta-method, because the signal is known at run time only.
     const int slot = staticMetaObject.indexOfSlot("propertyChanged()");
     connect(sender, property.notifySignal(), this, staticMetaObject.method(slot));
 }
