@@ -1,1 +1,5 @@
+hmi_add_test(named guardedpropertychangetransition)
+hmi_add_test(named guardedpropertytransition)
+hmi_add_test(named guardedsignaltransition)
+hmi_add_test(named keysignaltransition)
 hmi_add_test(named namedstate)
