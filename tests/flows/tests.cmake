@@ -1,0 +1,1 @@
+hmi_add_test(flows keyhandling)
