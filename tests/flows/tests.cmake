@@ -1,1 +1,2 @@
+hmi_add_test(flows arbitration)
 hmi_add_test(flows keyhandling)
