@@ -88,6 +88,7 @@ private Q_SLOTS:
     void aGuardMayDestroyASibling();
     void aGuardMayRegisterATransition();
     void aGuardMayAddAnotherGroup();
+    void aGuardMayDestroyTheGroup();
     void aSiblingActivatedTwiceIsDeactivatedOnce();
     void nothingIsNoTransition();
     void aFunctorIsSaneWhileAllThreeAreInPlace();
@@ -890,6 +891,26 @@ void tst_ParallelSiblingTransitionGroup::aGuardMayAddAnotherGroup()
 
     QCOMPARE(low->activeSiblingTest(&event), false);
     QCOMPARE(low->activeSiblingTest(&event), true);
+}
+
+void tst_ParallelSiblingTransitionGroup::aGuardMayDestroyTheGroup()
+{
+    QPointer<ParallelSiblingTransitionGroup> group(new ParallelSiblingTransitionGroup);
+    Regions regions({"Low", "Mid", "High"});
+    auto *mid = makeTransition(regions, "Mid");
+    connect(mid, &HmiTransition::transitionTest, mid, [&group, mid] {
+        delete group;
+        mid->setAllowTransition(false);
+    });
+    QVERIFY(group->addTransition(makeTransition(regions, "Low"), 1));
+    QVERIFY(group->addTransition(mid, 2));
+    QVERIFY(group->addTransition(makeTransition(regions, "High"), 3));
+    regions.start();
+
+    regions.post("Go");
+
+    QVERIFY(!group);
+    QCOMPARE(regions.active(), QStringList({"LowAway", "MidHome", "HighAway"}));
 }
 
 void tst_ParallelSiblingTransitionGroup::aSiblingActivatedTwiceIsDeactivatedOnce()

@@ -60,9 +60,13 @@ bool ParallelSiblingTransitionGroup::internalEventTest(NamedTargetTransitionBase
 {
     const int priority = m_priorities.value(transition, 0);
     // Copied, because the siblings' guards are the application's code and may end up in a slot
-    // here.
+    // here, or destroy the group.
     const auto siblings = m_activeSiblings;
+    const QPointer<const ParallelSiblingTransitionGroup> self(this);
     for (NamedTargetTransitionBase *sibling : siblings) {
+        if (!self) {
+            return false;
+        }
         if (sibling == transition) {
             continue;
         }
