@@ -19,6 +19,7 @@ private Q_SLOTS:
     void itsMetaObjectIsAsPublished();
     void theNotifySignalIsFoundByThePropertysName_data();
     void theNotifySignalIsFoundByThePropertysName();
+    void aNullNameIsNoProperty();
     void itWatchesTheNotifySignal();
     void itDeniesByDefault();
     void aChangeFiresWhenTheGuardAllows();
@@ -62,6 +63,17 @@ void tst_GuardedPropertyTransition::theNotifySignalIsFoundByThePropertysName()
     Emitter emitter;
 
     QTEST(extractNotifySignal(hasObject ? &emitter : nullptr, property.constData()), "signal");
+}
+
+void tst_GuardedPropertyTransition::aNullNameIsNoProperty()
+{
+    Emitter emitter;
+    TwoStates flow;
+
+    const GuardedPropertyTransition transition(&emitter, nullptr, flow.source);
+
+    QCOMPARE(extractNotifySignal(&emitter, nullptr), QByteArray());
+    QCOMPARE(transition.signal(), QByteArray());
 }
 
 void tst_GuardedPropertyTransition::itWatchesTheNotifySignal()

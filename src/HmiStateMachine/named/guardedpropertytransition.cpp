@@ -7,7 +7,7 @@ namespace HmiStateMachine {
 
 QByteArray extractNotifySignal(QObject *object, const char *propertyName)
 {
-    if (!object) {
+    if (!object || !propertyName) {
         return QByteArray();
     }
     const QMetaObject *meta = object->metaObject();

@@ -9,7 +9,7 @@ namespace HmiStateMachine {
 
 /**
  * The signature of the notify signal of a property, without the leading code of SIGNAL(); empty for
- * a null @p object, a property that does not exist or one without a notify signal.
+ * a null @p object or name, a property that does not exist or one without a notify signal.
  */
 HMISTATEMACHINE_EXPORT QByteArray extractNotifySignal(QObject *object, const char *propertyName);
 
