@@ -76,6 +76,11 @@ NamedState::NamedState(const QString &name, QState::ChildMode childMode, QState 
 
 NamedState::~NamedState()
 {
+    // The list of monitors goes before the base does: from here on no monitor's end may reach it,
+    // this state's own included.
+    for (const NamedState *monitor : qAsConst(m_monitoringStates)) {
+        disconnect(monitor, &QObject::destroyed, this, &NamedState::forgetMonitor);
+    }
     // Required: frees the entry of that name whichever state holds it.
     removeFromHash(m_name);
 }
