@@ -257,7 +257,7 @@ void tst_SimpleEvent::aBackRequestOfSeveralStepsEndsAfterTheLast()
     QScopedPointer<HmiBackEvent> event(new HmiBackEvent(4, "Home"));
     QList<int> depths;
 
-    while (event) {
+    for (int presses = 0; event && presses < 10; ++presses) {
         depths.append(event->depth());
         event.reset(HmiBackEvent::followOnEvent(event->depth(), event->targetId(), "Map"));
     }
