@@ -495,6 +495,7 @@ void tst_NamedState::anEmptyNameIsNotRegistered()
 
     QCOMPARE(NamedState::hash(QString(), &state), false);
     QCOMPARE(NamedState::hash("", &state), false);
+    QCOMPARE(NamedState::hash("Nobody", nullptr), false);
 
     QCOMPARE(NamedState::namedStates(), QList<NamedState *>());
     QCOMPARE(messages().take(), QStringList());

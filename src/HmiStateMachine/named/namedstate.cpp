@@ -112,7 +112,7 @@ QList<NamedState *> NamedState::namedStates()
 
 bool NamedState::hash(const QString &name, NamedState *state)
 {
-    if (name.isEmpty()) {
+    if (name.isEmpty() || !state) {
         return false;
     }
     Registry &r = registry();

@@ -52,8 +52,8 @@ public:
     static QList<NamedState *> namedStates();
 
     /**
-     * Registers @p state under @p name. False when the name is empty, or when another state holds
-     * it, which is a warning; the registry is unchanged then. Thread-safe.
+     * Registers @p state under @p name. False when the name is empty or the state null, or when
+     * another state holds the name, which is a warning; the registry is unchanged then. Thread-safe.
      */
     static bool hash(const QString &name, NamedState *state);
 
