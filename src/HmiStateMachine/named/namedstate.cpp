@@ -191,12 +191,15 @@ void NamedState::registerMonitoringState(NamedState *state)
         return;
     }
     m_monitoringStates.append(state);
-    connect(state, &QObject::destroyed, this, &NamedState::forgetMonitor);
+    // Not for itself: when a state announces its end, its own list is gone already.
+    if (state != this) {
+        connect(state, &QObject::destroyed, this, &NamedState::forgetMonitor);
+    }
 }
 
 void NamedState::unregisterMonitoringState(NamedState *state)
 {
-    if (m_monitoringStates.removeAll(state) > 0) {
+    if (m_monitoringStates.removeAll(state) > 0 && state != this) {
         disconnect(state, &QObject::destroyed, this, &NamedState::forgetMonitor);
     }
 }
