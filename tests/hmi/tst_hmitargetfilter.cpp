@@ -63,6 +63,20 @@ Filter makeFilter(const QString &kind, const QString &pattern)
     return Filter(new HmiModuleWhitelistFilter(pattern));
 }
 
+void addColumns()
+{
+    QTest::addColumn<QString>("kind");
+    QTest::addColumn<QString>("pattern");
+    QTest::addColumn<QString>("target");
+    QTest::addColumn<bool>("valid");
+}
+
+void addRow(const char *kind, const char *pattern, const char *target, bool valid)
+{
+    const QByteArray tag = QByteArray(kind) + ' ' + pattern + ": " + target;
+    QTest::newRow(tag) << QString(kind) << QString(pattern) << QString(target) << valid;
+}
+
 } // namespace
 
 class tst_HmiTargetFilter : public LibraryTest
@@ -70,10 +84,12 @@ class tst_HmiTargetFilter : public LibraryTest
     Q_OBJECT
 
 private Q_SLOTS:
-    void aFilterJudgesATarget_data();
-    void aFilterJudgesATarget();
-    void anEmptyTargetIsJudgedLikeAnyOther_data();
-    void anEmptyTargetIsJudgedLikeAnyOther();
+    void aTargetFilterComparesWholeNames_data();
+    void aTargetFilterComparesWholeNames();
+    void aModuleFilterComparesTheLeadingPart_data();
+    void aModuleFilterComparesTheLeadingPart();
+    void emptyNamesAreJudgedLikeAnyOther_data();
+    void emptyNamesAreJudgedLikeAnyOther();
     void aViewWithoutFiltersAcceptsEverything();
     void aViewAcceptsWhatAllItsFiltersAccept_data();
     void aViewAcceptsWhatAllItsFiltersAccept();
@@ -84,45 +100,23 @@ private Q_SLOTS:
     void aRefusedViewIsNoBackTarget();
 };
 
-void tst_HmiTargetFilter::aFilterJudgesATarget_data()
+void tst_HmiTargetFilter::aTargetFilterComparesWholeNames_data()
 {
-    QTest::addColumn<QString>("kind");
-    QTest::addColumn<QString>("pattern");
-    QTest::addColumn<QString>("target");
-    QTest::addColumn<bool>("valid");
+    addColumns();
 
-    const auto row = [](const char *kind, const char *pattern, const char *target, bool valid) {
-        const QByteArray tag = QByteArray(kind) + ' ' + pattern + ": " + target;
-        QTest::newRow(tag) << QString(kind) << QString(pattern) << QString(target) << valid;
-    };
-    row("target blacklist", "A", "A", false);
-    row("target blacklist", "A", "AB", true);
-    row("target blacklist", "A", "BA", true);
-    row("target blacklist", "A", "a", true);
-    row("target blacklist", "AB", "A", true);
-    row("target whitelist", "A", "A", true);
-    row("target whitelist", "A", "AB", false);
-    row("target whitelist", "A", "BA", false);
-    row("target whitelist", "A", "a", false);
-    row("target whitelist", "AB", "A", false);
-    row("module blacklist", "Media", "MediaMain", false);
-    row("module blacklist", "Media", "Media", false);
-    row("module blacklist", "Media", "Mediation", false);
-    row("module blacklist", "Media", "media", true);
-    row("module blacklist", "Media", "MEDIAMain", true);
-    row("module blacklist", "Media", "MainMedia", true);
-    row("module blacklist", "Media", "Med", true);
-    row("module whitelist", "Media", "MediaMain", true);
-    row("module whitelist", "Media", "Media", true);
-    row("module whitelist", "Media", "Mediation", true);
-    row("module whitelist", "Media", "media", false);
-    row("module whitelist", "Media", "MEDIAMain", false);
-    row("module whitelist", "Media", "MainMedia", false);
-    row("module whitelist", "Media", "Med", false);
-    row("module whitelist", "Media.*", "MediaMain", false);
+    addRow("target blacklist", "A", "A", false);
+    addRow("target blacklist", "A", "AB", true);
+    addRow("target blacklist", "A", "BA", true);
+    addRow("target blacklist", "A", "a", true);
+    addRow("target blacklist", "AB", "A", true);
+    addRow("target whitelist", "A", "A", true);
+    addRow("target whitelist", "A", "AB", false);
+    addRow("target whitelist", "A", "BA", false);
+    addRow("target whitelist", "A", "a", false);
+    addRow("target whitelist", "AB", "A", false);
 }
 
-void tst_HmiTargetFilter::aFilterJudgesATarget()
+void tst_HmiTargetFilter::aTargetFilterComparesWholeNames()
 {
     QFETCH(QString, kind);
     QFETCH(QString, pattern);
@@ -133,12 +127,41 @@ void tst_HmiTargetFilter::aFilterJudgesATarget()
     QTEST(filter->isValid(target), "valid");
 }
 
-void tst_HmiTargetFilter::anEmptyTargetIsJudgedLikeAnyOther_data()
+void tst_HmiTargetFilter::aModuleFilterComparesTheLeadingPart_data()
 {
-    QTest::addColumn<QString>("kind");
-    QTest::addColumn<QString>("pattern");
-    QTest::addColumn<QString>("target");
-    QTest::addColumn<bool>("valid");
+    addColumns();
+
+    addRow("module blacklist", "Media", "MediaMain", false);
+    addRow("module blacklist", "Media", "Media", false);
+    addRow("module blacklist", "Media", "Mediation", false);
+    addRow("module blacklist", "Media", "media", true);
+    addRow("module blacklist", "Media", "MEDIAMain", true);
+    addRow("module blacklist", "Media", "MainMedia", true);
+    addRow("module blacklist", "Media", "Med", true);
+    addRow("module whitelist", "Media", "MediaMain", true);
+    addRow("module whitelist", "Media", "Media", true);
+    addRow("module whitelist", "Media", "Mediation", true);
+    addRow("module whitelist", "Media", "media", false);
+    addRow("module whitelist", "Media", "MEDIAMain", false);
+    addRow("module whitelist", "Media", "MainMedia", false);
+    addRow("module whitelist", "Media", "Med", false);
+    addRow("module whitelist", "Media.*", "MediaMain", false);
+}
+
+void tst_HmiTargetFilter::aModuleFilterComparesTheLeadingPart()
+{
+    QFETCH(QString, kind);
+    QFETCH(QString, pattern);
+    QFETCH(QString, target);
+
+    const Filter filter = makeFilter(kind, pattern);
+
+    QTEST(filter->isValid(target), "valid");
+}
+
+void tst_HmiTargetFilter::emptyNamesAreJudgedLikeAnyOther_data()
+{
+    addColumns();
 
     QTest::newRow("blacklist of a name") << "target blacklist"
                                          << "A" << QString() << true;
@@ -158,7 +181,7 @@ void tst_HmiTargetFilter::anEmptyTargetIsJudgedLikeAnyOther_data()
                                                << "Radio" << true;
 }
 
-void tst_HmiTargetFilter::anEmptyTargetIsJudgedLikeAnyOther()
+void tst_HmiTargetFilter::emptyNamesAreJudgedLikeAnyOther()
 {
     QFETCH(QString, kind);
     QFETCH(QString, pattern);

@@ -34,6 +34,7 @@ private Q_SLOTS:
     void aProviderWithoutATargetIsPassedOver_data();
     void aProviderWithoutATargetIsPassedOver();
     void theProviderIsNotAskedWithoutALastKnownView();
+    void theProviderLeavesATreatedEntryForLater();
     void theProviderKeepsTheBackStackEmpty();
     void anEntryTreatedAsBackTakesItsTargetFromTheBackStack_data();
     void anEntryTreatedAsBackTakesItsTargetFromTheBackStack();
@@ -44,6 +45,8 @@ private Q_SLOTS:
     void anAcceptedLastKnownViewIsTheTarget();
     void aRefusedLastKnownViewHandsOnToItsOwnTarget();
     void theWalkUsesTheFiltersOfTheEnteredView();
+    void theWalkFindsViewsByWhatTheyShow();
+    void aCircleEndsAtTheFirstAcceptedView();
     void theEndOfTheWalkIsLogged();
     void anUnknownTargetOnTheWalkIsLogged();
     void aRefusedStateThatIsNoViewEndsTheWalk();
@@ -206,6 +209,26 @@ void tst_HmiViewStateBackStack::theProviderIsNotAskedWithoutALastKnownView()
     flow.request("List");
 
     QCOMPARE(list->backTarget(), QString());
+}
+
+void tst_HmiViewStateBackStack::theProviderLeavesATreatedEntryForLater()
+{
+    ViewFlow flow;
+    flow.view("Map");
+    HmiViewState *player = flow.backView("Player");
+    HmiViewState *list = flow.backView("List");
+    list->setBackTargetProviderState(player);
+    list->setTreatNextEntryAsBackTransition(true);
+    flow.start(flow.view("Home"));
+    flow.request("Player");
+    flow.request("List");
+    flow.request("Home");
+
+    list->setBackTargetProviderState(nullptr);
+    list->pushBackStack("Map");
+    flow.request("List");
+
+    QCOMPARE(list->backTarget(), QString("Map"));
 }
 
 void tst_HmiViewStateBackStack::theProviderKeepsTheBackStackEmpty()
@@ -374,6 +397,37 @@ void tst_HmiViewStateBackStack::theWalkUsesTheFiltersOfTheEnteredView()
     flow.request("Radio");
 
     QCOMPARE(radio->backTarget(), QString("Home"));
+}
+
+void tst_HmiViewStateBackStack::theWalkFindsViewsByWhatTheyShow()
+{
+    ViewFlow flow;
+    flow.viewOf("PlayerScreen", "Player");
+    HmiViewState *radio = flow.backView("Radio");
+    radio->addBackTargetFilter(Filter(new HmiTargetBlacklistFilter("PlayerScreen")));
+    flow.start(flow.view("Home"));
+    flow.request("Player");
+
+    QCOMPARE(radio->getValidBackTarget("PlayerScreen"), QString("Home"));
+    QCOMPARE(radio->getValidBackTarget("Player"), QString("Player"));
+}
+
+void tst_HmiViewStateBackStack::aCircleEndsAtTheFirstAcceptedView()
+{
+    ViewFlow flow;
+    HmiViewState *player = flow.backView("Player");
+    HmiViewState *list = flow.backView("List");
+    HmiViewState *radio = flow.backView("Radio");
+    radio->addBackTargetFilter(Filter(new HmiTargetBlacklistFilter("Player")));
+    flow.start(player);
+    flow.request("List");
+    flow.request("Player");
+    QCOMPARE(player->backTarget(), QString("List"));
+    QCOMPARE(list->backTarget(), QString("Player"));
+
+    flow.request("Radio");
+
+    QCOMPARE(radio->backTarget(), QString("List"));
 }
 
 void tst_HmiViewStateBackStack::theEndOfTheWalkIsLogged()

@@ -5,6 +5,7 @@
 #include <HmiStateMachine/hmi/hmibacktransition.h>
 #include <HmiStateMachine/hmi/hmiviewstate.h>
 #include <HmiStateMachine/named/hmibackevent.h>
+#include <HmiStateMachine/named/hmiviewevent.h>
 #include <HmiStateMachine/named/statemachine.h>
 
 #include <QSignalSpy>
@@ -94,6 +95,7 @@ private Q_SLOTS:
     void theDataOfTheLastKnownViewGoesWithIt();
     void anUnknownLastKnownViewIsRequestedWithoutData();
     void theTimeoutIsSignalledBeforeTheReturn();
+    void theReturnWaitsForItsTurn();
     void onlyAnActiveDummyReturns();
     void aViewThatShowsSomethingDoesNotReturn();
     void itBorrowsTheBackTargetOfTheViewLeftLast();
@@ -260,6 +262,22 @@ void tst_HmiViewStateDummy::theTimeoutIsSignalledBeforeTheReturn()
 
     QVERIFY(activeAtTimeout);
     QVERIFY(flow.dummy->isActive());
+}
+
+void tst_HmiViewStateDummy::theReturnWaitsForItsTurn()
+{
+    Returning flow;
+    const QScopedPointer<HmiViewState> map(new HmiViewState("Map", flow.machine));
+    HmiViewState::setLastKnownViewState("Home");
+    connect(flow.dummy, &HmiViewState::dummyViewStateTimeout, this,
+            [&] { flow.machine->postEvent(new HmiViewEvent("Map", QVariant())); });
+    flow.enterDummy();
+    flow.journal.clear();
+
+    QVERIFY(flow.timeOut());
+
+    QCOMPARE(flow.journal.lines(),
+             QStringList({"activateView Map", "deactivateView Map", "activateView Home"}));
 }
 
 void tst_HmiViewStateDummy::onlyAnActiveDummyReturns()
