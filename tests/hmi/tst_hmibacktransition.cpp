@@ -1,5 +1,6 @@
 #include "driving.h"
 #include "librarytest.h"
+#include "makeevent.h"
 #include "metadescription.h"
 
 #include <HmiStateMachine/hmi/hmibacktransition.h>
@@ -40,11 +41,7 @@ struct Screens
     NamedState *map = new NamedState("Map", &machine);
 };
 
-using MakeEvent = QEvent *(*)();
-
 } // namespace
-
-Q_DECLARE_METATYPE(MakeEvent)
 
 class tst_HmiBackTransition : public LibraryTest
 {
@@ -141,11 +138,11 @@ void tst_HmiBackTransition::otherEventsDoNotTriggerIt_data()
     QTest::addColumn<MakeEvent>("make");
 
     const auto row = [](const char *tag, MakeEvent make) { QTest::newRow(tag) << make; };
-    row("a named event", [] { return static_cast<QEvent *>(new HmiEvent("Home", QVariant())); });
-    row("a view", [] { return static_cast<QEvent *>(new HmiViewEvent("Home", QVariant())); });
-    row("a popup", [] { return static_cast<QEvent *>(new PopupEvent("Home", QVariant())); });
-    row("a fallback", [] { return static_cast<QEvent *>(new HmiFallbackEvent("Home")); });
-    row("the application's", [] { return new QEvent(QEvent::User); });
+    row("a named event", []() -> QEvent * { return new HmiEvent("Home", QVariant()); });
+    row("a view", []() -> QEvent * { return new HmiViewEvent("Home", QVariant()); });
+    row("a popup", []() -> QEvent * { return new PopupEvent("Home", QVariant()); });
+    row("a fallback", []() -> QEvent * { return new HmiFallbackEvent("Home"); });
+    row("the application's", []() -> QEvent * { return new QEvent(QEvent::User); });
 }
 
 void tst_HmiBackTransition::otherEventsDoNotTriggerIt()

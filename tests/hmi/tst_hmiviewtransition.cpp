@@ -1,5 +1,6 @@
 #include "driving.h"
 #include "librarytest.h"
+#include "makeevent.h"
 #include "metadescription.h"
 #include "viewflow.h"
 
@@ -15,14 +16,6 @@
 #include <QtTest>
 
 using namespace HmiStateMachine;
-
-namespace {
-
-using MakeEvent = QEvent *(*)();
-
-} // namespace
-
-Q_DECLARE_METATYPE(MakeEvent)
 
 class tst_HmiViewTransition : public LibraryTest
 {
@@ -161,11 +154,11 @@ void tst_HmiViewTransition::otherEventsDoNotTriggerIt_data()
     QTest::addColumn<MakeEvent>("make");
 
     const auto row = [](const char *tag, MakeEvent make) { QTest::newRow(tag) << make; };
-    row("a named event", [] { return static_cast<QEvent *>(new HmiEvent("Radio", QVariant())); });
-    row("a back press", [] { return static_cast<QEvent *>(new HmiBackEvent(1, "Radio")); });
-    row("a popup", [] { return static_cast<QEvent *>(new PopupEvent("Radio", QVariant())); });
-    row("a fallback", [] { return static_cast<QEvent *>(new HmiFallbackEvent("Radio")); });
-    row("the application's", [] { return new QEvent(QEvent::User); });
+    row("a named event", []() -> QEvent * { return new HmiEvent("Radio", QVariant()); });
+    row("a back press", []() -> QEvent * { return new HmiBackEvent(1, "Radio"); });
+    row("a popup", []() -> QEvent * { return new PopupEvent("Radio", QVariant()); });
+    row("a fallback", []() -> QEvent * { return new HmiFallbackEvent("Radio"); });
+    row("the application's", []() -> QEvent * { return new QEvent(QEvent::User); });
 }
 
 void tst_HmiViewTransition::otherEventsDoNotTriggerIt()
