@@ -3,6 +3,8 @@
 #include <HmiStateMachine/hmi/hmisignaltransition.h>
 #include <HmiStateMachine/hmistatemachine_export.h>
 
+#include <QEvent> // complete, or the guard signals cannot be connected by member pointer
+
 namespace HmiStateMachine {
 
 /**

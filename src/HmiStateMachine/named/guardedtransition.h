@@ -4,6 +4,7 @@
 #include <HmiStateMachine/named/namedtargettransitionbase.h>
 
 #include <QAbstractTransition>
+#include <QEvent> // complete, or the guard signals cannot be connected by member pointer
 
 namespace HmiStateMachine {
 
