@@ -1,0 +1,28 @@
+# hmi_add_output_test(<name> COMMAND <command> [<argument>...] EXPECTED <file>
+#                     [EXIT_CODE <code>] [STREAM stdout|stderr] [DIRECTORY <dir>] [LABELS <label>...])
+#
+# A test that runs a command and compares all that it writes, and its exit code, with a file. What
+# it wrote is left beside the build as <name>.actual when it differs.
+function(hmi_add_output_test name)
+    cmake_parse_arguments(PARSE_ARGV 1 arg "" "EXPECTED;EXIT_CODE;STREAM;DIRECTORY" "COMMAND;LABELS")
+    list(POP_FRONT arg_COMMAND target)
+    if(NOT arg_EXIT_CODE)
+        set(arg_EXIT_CODE 0)
+    endif()
+    if(NOT arg_STREAM)
+        set(arg_STREAM stdout)
+    endif()
+    if(NOT arg_DIRECTORY)
+        set(arg_DIRECTORY ${CMAKE_CURRENT_SOURCE_DIR})
+    endif()
+    add_test(NAME ${name}
+        COMMAND ${CMAKE_COMMAND}
+            -DEXPECTED=${arg_EXPECTED}
+            -DEXIT_CODE=${arg_EXIT_CODE}
+            -DSTREAM=${arg_STREAM}
+            -DACTUAL=${CMAKE_CURRENT_BINARY_DIR}/${name}.actual
+            -P ${PROJECT_SOURCE_DIR}/examples/compare_output.cmake
+            -- $<TARGET_FILE:${target}> ${arg_COMMAND}
+        WORKING_DIRECTORY ${arg_DIRECTORY})
+    set_tests_properties(${name} PROPERTIES LABELS "${arg_LABELS}" TIMEOUT 30)
+endfunction()
