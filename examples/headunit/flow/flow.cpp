@@ -1,0 +1,81 @@
+#include "flow.h"
+
+#include "parts.h"
+
+#include <HmiStateMachine/hmi/hmiviewstate.h>
+#include <HmiStateMachine/named/statemachine.h>
+
+using namespace HmiStateMachine;
+
+namespace headunit {
+
+namespace {
+
+struct Part
+{
+    const char *name;
+    void (*addStates)(QState *);
+    void (*addTransitions)(const Surroundings &);
+};
+
+const Part domains[] = {
+    {"Home", addHomeViews, addHomeTransitions},
+    {"Media", addMediaViews, addMediaTransitions},
+    {"Phone", addPhoneViews, addPhoneTransitions},
+    {"Navigation", addNavigationViews, addNavigationTransitions},
+    {"Settings", addSettingsViews, addSettingsTransitions},
+};
+
+const Part regions[] = {
+    {"Guidance", addGuidanceStates, addGuidanceTransitions},
+    {"Audio", addAudioStates, addAudioTransitions},
+};
+
+// A domain is a plain named state: only views announce a popup behaviour to the view layer.
+void addPart(const Part &part, QState *parent)
+{
+    auto *region = new NamedState(part.name, parent);
+    part.addStates(region);
+}
+
+void addStates(QState *headUnit)
+{
+    auto *screens = new NamedState("Screens", headUnit);
+    for (const Part &domain : domains) {
+        addPart(domain, screens);
+    }
+    screens->setInitialState(state("Home"));
+    for (const Part &region : regions) {
+        addPart(region, headUnit);
+    }
+    new NamedState("Keys", headUnit);
+}
+
+// The keys come first: a state can block only such keys as are known by then.
+void addTransitions(const Surroundings &surroundings)
+{
+    addKeyTransitions(surroundings);
+    for (const Part &domain : domains) {
+        domain.addTransitions(surroundings);
+    }
+    for (const Part &region : regions) {
+        region.addTransitions(surroundings);
+    }
+    addVoiceTransitions(surroundings);
+}
+
+} // namespace
+
+void buildFlow(const Surroundings &surroundings)
+{
+    StateMachine *machine = StateMachine::instance();
+    auto *headUnit = new NamedState("HeadUnit", QState::ParallelStates, machine);
+    addStates(headUnit);
+    addTransitions(surroundings);
+    machine->setInitialState(headUnit);
+
+    // As if home had just been left: the view that is opened first has somewhere to lead back to.
+    HmiViewState::setLastKnownViewState("Home/Main");
+}
+
+} // namespace headunit

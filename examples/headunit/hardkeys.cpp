@@ -1,0 +1,33 @@
+#include "hardkeys.h"
+
+#include <QMetaEnum>
+
+namespace headunit {
+
+HardKeys::HardKeys(QObject *parent) : QObject(parent)
+{
+}
+
+HardKeys::~HardKeys() = default;
+
+const char *HardKeys::signal()
+{
+    return SIGNAL(keyChanged(int, int));
+}
+
+QStringList HardKeys::names()
+{
+    const auto keys = QMetaEnum::fromType<Key>();
+    QStringList result;
+    for (int i = 0; i < keys.keyCount(); ++i) {
+        result.append(QString::fromLatin1(keys.key(i)));
+    }
+    return result;
+}
+
+int HardKeys::fromName(const QString &name)
+{
+    return QMetaEnum::fromType<Key>().keyToValue(qPrintable(name));
+}
+
+} // namespace headunit
