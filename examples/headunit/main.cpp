@@ -76,6 +76,22 @@ std::optional<LocatedFault> runScenario(const QString &path, const Stage &stage)
     return runner.run(commands);
 }
 
+ExitCode report(const QString &file, const std::optional<LocatedFault> &fault,
+                const Transcript &transcript)
+{
+    if (fault) {
+        write(stderr, faultText(file, *fault));
+        return ScenarioFailed;
+    }
+    if (transcript.failed()) {
+        write(stderr,
+              "expected to write the transcript, found an error of the output\n"
+              "    remedy: look whether the disk is full");
+        return ScenarioFailed;
+    }
+    return Success;
+}
+
 int drive(const QStringList &files, bool list)
 {
     Transcript transcript(stdout);
@@ -88,12 +104,9 @@ int drive(const QStringList &files, bool list)
         return Success;
     }
     const auto fault = runScenario(files.first(), {&vehicle, &keys, &viewLayer, &transcript});
-    if (fault) {
-        write(stderr, faultText(files.first(), *fault));
-    }
     HmiStateMachine::StateMachine::instance()->stop();
     QCoreApplication::sendPostedEvents();
-    return fault ? ScenarioFailed : Success;
+    return report(files.first(), fault, transcript);
 }
 
 } // namespace

@@ -47,6 +47,11 @@ void Transcript::note(const QString &text)
     ++m_linesOfCommand;
 }
 
+bool Transcript::failed() const
+{
+    return m_stream.status() != QTextStream::Ok;
+}
+
 // The next narration begins a new paragraph.
 void Transcript::writeBelowNarration(const QString &text)
 {

@@ -20,6 +20,9 @@ public:
     void call(const QString &operation, const QString &subject, const QVariant &data = QVariant());
     void note(const QString &text);
 
+    /** Some of it could not be written. */
+    bool failed() const;
+
     /** The number of calls since the last reset. */
     int calls() const { return m_calls; }
     void resetCalls() { m_calls = 0; }
