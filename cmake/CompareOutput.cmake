@@ -1,17 +1,37 @@
-# Runs PROGRAM with ARGUMENTS and compares what it writes, to both outputs, with the file EXPECTED.
-# EXIT_CODE is what it has to end with, 0 unless given. Debug output is off.
+# cmake -DEXPECTED=.. -DEXIT_CODE=.. -DSTREAM=.. -DACTUAL=.. -P CompareOutput.cmake -- <command>...
+#
+# Fails when the command's output on STREAM is not the text of EXPECTED, when its exit code is not
+# EXIT_CODE, or when it succeeds and yet writes to stderr, unless that is what is compared.
 
-if(NOT DEFINED EXIT_CODE)
-    set(EXIT_CODE 0)
-endif()
-set(ENV{QT_FORCE_STDERR_LOGGING} 1)
-set(ENV{QT_LOGGING_RULES} "*.debug=false")
-execute_process(COMMAND ${PROGRAM} ${ARGUMENTS}
-    RESULT_VARIABLE result OUTPUT_VARIABLE output ERROR_VARIABLE output)
+set(command "")
+set(found_separator FALSE)
+math(EXPR last "${CMAKE_ARGC} - 1")
+foreach(index RANGE ${last})
+    if(found_separator)
+        list(APPEND command "${CMAKE_ARGV${index}}")
+    elseif(CMAKE_ARGV${index} STREQUAL "--")
+        set(found_separator TRUE)
+    endif()
+endforeach()
+
+execute_process(COMMAND ${command}
+    OUTPUT_VARIABLE stdout
+    ERROR_VARIABLE stderr
+    RESULT_VARIABLE exit_code)
 file(READ ${EXPECTED} expected)
-if(NOT result STREQUAL EXIT_CODE)
-    message(FATAL_ERROR "Ended with ${result} instead of ${EXIT_CODE}:\n${output}")
+
+if(NOT "${${STREAM}}" STREQUAL "${expected}")
+    file(WRITE ${ACTUAL} "${${STREAM}}")
+    find_program(DIFF diff)
+    if(DIFF)
+        execute_process(COMMAND ${DIFF} -u ${EXPECTED} ${ACTUAL})
+    endif()
+    message(FATAL_ERROR "${STREAM} is not as expected.\n"
+        "Expected: ${EXPECTED}\nActual: ${ACTUAL}\nExit code: ${exit_code}\n${stderr}")
 endif()
-if(NOT output STREQUAL expected)
-    message(FATAL_ERROR "Expected (${EXPECTED}):\n${expected}\nFound:\n${output}")
+if(EXIT_CODE EQUAL 0 AND STREAM STREQUAL "stdout" AND NOT "${stderr}" STREQUAL "")
+    message(FATAL_ERROR "Nothing was expected on stderr, found:\n${stderr}")
+endif()
+if(NOT "${exit_code}" STREQUAL "${EXIT_CODE}")
+    message(FATAL_ERROR "Expected exit code ${EXIT_CODE}, found ${exit_code}\n${stderr}")
 endif()

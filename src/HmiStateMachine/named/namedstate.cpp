@@ -191,15 +191,12 @@ void NamedState::registerMonitoringState(NamedState *state)
         return;
     }
     m_monitoringStates.append(state);
-    // Not for itself: when a state announces its end, its own list is gone already.
-    if (state != this) {
-        connect(state, &QObject::destroyed, this, &NamedState::forgetMonitor);
-    }
+    connect(state, &QObject::destroyed, this, &NamedState::forgetMonitor);
 }
 
 void NamedState::unregisterMonitoringState(NamedState *state)
 {
-    if (m_monitoringStates.removeAll(state) > 0 && state != this) {
+    if (m_monitoringStates.removeAll(state) > 0) {
         disconnect(state, &QObject::destroyed, this, &NamedState::forgetMonitor);
     }
 }

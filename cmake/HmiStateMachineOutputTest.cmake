@@ -21,7 +21,7 @@ function(hmi_add_output_test name)
             -DEXIT_CODE=${arg_EXIT_CODE}
             -DSTREAM=${arg_STREAM}
             -DACTUAL=${CMAKE_CURRENT_BINARY_DIR}/${name}.actual
-            -P ${PROJECT_SOURCE_DIR}/examples/compare_output.cmake
+            -P ${PROJECT_SOURCE_DIR}/cmake/CompareOutput.cmake
             -- $<TARGET_FILE:${target}> ${arg_COMMAND}
         WORKING_DIRECTORY ${arg_DIRECTORY})
     set_tests_properties(${name} PROPERTIES LABELS "${arg_LABELS}" TIMEOUT 30)
