@@ -1,5 +1,6 @@
 #include <HmiStateMachine/hmi/hmisignaltransition.h>
 
+#include <HmiStateMachine/internal/exclusivelayer.h>
 #include <HmiStateMachine/internal/siblinggroups.h>
 #include <HmiStateMachine/named/parallelsiblingtransitiongroup.h>
 
@@ -16,7 +17,7 @@ HmiSignalTransition::HmiSignalTransition(QState *sourceState)
 
 HmiSignalTransition::HmiSignalTransition(const QObject *sender, const char *signal,
                                          QState *sourceState)
-    : QSignalTransition(sender, signal, sourceState)
+    : QSignalTransition(sender, signal, exclusiveLayerOf(sourceState))
 {
     // First of all connections to triggered(), so that the arguments are told before anything else.
     connect(this, &QAbstractTransition::triggered, TriggerFunctor(this));

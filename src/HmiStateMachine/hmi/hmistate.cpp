@@ -1,6 +1,7 @@
 #include <HmiStateMachine/hmi/hmistate.h>
 
 #include <HmiStateMachine/hmi/hmisignaltransition.h>
+#include <HmiStateMachine/internal/exclusivelayer.h>
 #include <HmiStateMachine/internal/logging.h>
 #include <HmiStateMachine/named/viewstatetarget.h>
 
@@ -14,8 +15,9 @@ constexpr char screenEntryMarker[] = "P12.R041.02 - Screen Entry: Start Marker";
 
 HmiState::HmiState(const QString &name, QState *parent) : NamedState(name, nullptr)
 {
-    setParent(parent);
-    inheritPopupBehavior(parent);
+    setParent(exclusiveLayerOf(parent));
+    // From the layer, not the layered state: an explicit setting cuts the connection to the parent.
+    inheritPopupBehavior(parentState());
 }
 
 HmiState::HmiState(QState *parent) : NamedState(parent)

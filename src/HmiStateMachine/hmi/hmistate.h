@@ -24,7 +24,10 @@ public:
         PopupBehaviorOn = 2 ///< entry switches popups on
     };
 
+    /** Lands in the exclusive layer of a @p parent that has layers. */
     explicit HmiState(const QString &name, QState *parent = nullptr);
+
+    /** Stays a child of @p parent itself, also when that has layers. */
     explicit HmiState(QState *parent = nullptr);
     ~HmiState() override;
 

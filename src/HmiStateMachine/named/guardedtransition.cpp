@@ -1,5 +1,6 @@
 #include <HmiStateMachine/named/guardedtransition.h>
 
+#include <HmiStateMachine/internal/exclusivelayer.h>
 #include <HmiStateMachine/internal/siblinggroups.h>
 #include <HmiStateMachine/named/parallelsiblingtransitiongroup.h>
 
@@ -7,7 +8,8 @@
 
 namespace HmiStateMachine {
 
-GuardedTransition::GuardedTransition(QState *sourceState) : QAbstractTransition(sourceState)
+GuardedTransition::GuardedTransition(QState *sourceState)
+    : QAbstractTransition(exclusiveLayerOf(sourceState))
 {
 }
 

@@ -1,5 +1,6 @@
 #include <HmiStateMachine/named/simpleeventtransition.h>
 
+#include <HmiStateMachine/internal/exclusivelayer.h>
 #include <HmiStateMachine/internal/siblinggroups.h>
 #include <HmiStateMachine/named/parallelsiblingtransitiongroup.h>
 
@@ -13,7 +14,7 @@ SimpleEventTransition::SimpleEventTransition(QEvent::Type type, QState *sourceSt
 }
 
 SimpleEventTransition::SimpleEventTransition(const QList<QEvent::Type> &types, QState *sourceState)
-    : QAbstractTransition(sourceState), m_eventTypes(types)
+    : QAbstractTransition(exclusiveLayerOf(sourceState)), m_eventTypes(types)
 {
 }
 

@@ -1,6 +1,7 @@
 #include <HmiStateMachine/named/viewstatetarget.h>
 
 #include <HmiStateMachine/internal/metatypes.h>
+#include <HmiStateMachine/popup/popupstate.h>
 
 namespace HmiStateMachine {
 
@@ -36,6 +37,11 @@ void ViewStateTarget::unstackPopup(const QString &popupId)
 QList<QString> ViewStateTarget::stackedPopups() const
 {
     return m_stackedPopups;
+}
+
+bool ViewStateTarget::isPopupStateActive(const QString &popupId)
+{
+    return PopupState::isStateActive(popupId);
 }
 
 void ViewStateTarget::setVRViewRequest(bool request, const QVariant &data)

@@ -92,6 +92,9 @@ public:
     /** The popups on the popup stack, oldest first. */
     QList<QString> stackedPopups() const;
 
+    /** Whether a popup with that popup view id is entered. */
+    bool isPopupStateActive(const QString &popupId);
+
     /** Marks that a view was requested by voice, with the request's data; stays until changed. */
     void setVRViewRequest(bool request, const QVariant &data);
     bool vrViewRequest() const;
