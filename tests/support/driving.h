@@ -5,8 +5,9 @@ class QStateMachine;
 class QTimer;
 
 /**
- * Delivers what is posted, and what that posts in turn, and deletes what is scheduled for deletion;
- * fires no timer. Once is enough after any number of events.
+ * Delivers what is posted, and deletes what is scheduled for deletion; fires no timer. A running
+ * machine takes what is posted to it meanwhile too, so once is enough after any number of events.
+ * What is posted to others meanwhile is delivered by the next call.
  */
 void settle();
 
