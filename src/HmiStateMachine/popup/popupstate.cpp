@@ -379,7 +379,9 @@ void PopupState::setStoreBlockedPopups(bool store)
         return;
     }
     if (ViewStateTarget *target = ViewStateTarget::instance()) {
-        target->releaseBlockedPopups(r.blockedPopupStack);
+        // Copied, because the application's answer may dismiss or delete popups.
+        const auto released = r.blockedPopupStack;
+        target->releaseBlockedPopups(released);
     }
     r.blockedPopupStack.clear();
 }
