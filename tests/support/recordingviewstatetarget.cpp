@@ -1,6 +1,8 @@
 #include "recordingviewstatetarget.h"
 
 #include <HmiStateMachine/named/hmibackevent.h>
+#include <HmiStateMachine/named/popupevent.h>
+#include <HmiStateMachine/popup/popupstate.h>
 
 using namespace HmiStateMachine;
 
@@ -84,8 +86,10 @@ Identifier RecordingViewStateTarget::activeView() const
 
 void RecordingViewStateTarget::retryBlockedPopup(PopupState *popup)
 {
-    Q_UNUSED(popup)
-    m_journal.add("retryBlockedPopup");
+    m_journal.add("retryBlockedPopup " + popup->name());
+    if (m_retryMachine) {
+        m_retryMachine->postEvent(new PopupEvent(popup->name(), QVariant()));
+    }
 }
 
 void RecordingViewStateTarget::releaseBlockedPopups(const QMap<PopupState *, QTime> &blockedPopups)

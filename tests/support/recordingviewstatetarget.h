@@ -46,6 +46,9 @@ public:
      */
     void followBackRequests(QStateMachine *machine) { m_machine = machine; }
 
+    /** Answers a retry as an application does, by posting the request again to @p machine. */
+    void repostBlockedPopups(QStateMachine *machine) { m_retryMachine = machine; }
+
     /** Screen popup behaviour is told on every entry of a screen; off unless a test asks for it. */
     void recordPopupBehavior(bool on) { m_recordPopupBehavior = on; }
 
@@ -60,6 +63,7 @@ public:
 private:
     Journal &m_journal;
     QStateMachine *m_machine = nullptr;
+    QStateMachine *m_retryMachine = nullptr;
     bool m_recordPopupBehavior = false;
     QMap<QString, QVariantMap> m_viewData;
     QMap<QString, QVariantMap> m_popupData;

@@ -1,0 +1,12 @@
+hmi_add_test(popup domainblockedpopupstate)
+hmi_add_test(popup popupinterruptionstore)
+hmi_add_test(popup popupinterruptionstoreloading)
+hmi_add_test(popup popuptimeoutmonitor)
+target_compile_definitions(tst_popupinterruptionstoreloading PRIVATE
+    HMI_TEST_DATA_DIR="${CMAKE_CURRENT_LIST_DIR}/../data")
+if(HMISTATEMACHINE_SANITIZE)
+    # Sanitizers bring an allocator of their own, which a test cannot count in.
+    message(STATUS "Test of the popup rules' allocations: off (HMISTATEMACHINE_SANITIZE)")
+else()
+    hmi_add_test(popup popupinterruptionstoreallocation)
+endif()
