@@ -2,6 +2,7 @@ hmi_add_test(popup domainblockedpopupstate)
 hmi_add_test(popup popupinterruptionstore)
 hmi_add_test(popup popupinterruptionstoreloading)
 hmi_add_test(popup popuptimeoutmonitor)
+set_property(TEST popuptimeoutmonitor APPEND PROPERTY LABELS realtime)
 target_compile_definitions(tst_popupinterruptionstoreloading PRIVATE
     HMI_TEST_DATA_DIR="${CMAKE_CURRENT_LIST_DIR}/../data")
 if(HMISTATEMACHINE_SANITIZE)

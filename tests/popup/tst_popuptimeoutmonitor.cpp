@@ -32,9 +32,9 @@ struct Flow
 
     void start() { startIn(machine, layer); }
 
-    void post(const QString &target)
+    void post(const QString &request)
     {
-        machine.postEvent(new PopupEvent(target, QVariant()));
+        machine.postEvent(new PopupEvent(request, QVariant()));
         settle();
     }
 
@@ -206,15 +206,16 @@ void tst_PopupTimeoutMonitor::everyTickTellsOfTheRemainingTime()
 void tst_PopupTimeoutMonitor::aRepeatedRequestRestartsTheTick()
 {
     Flow flow;
+    flow.monitor->setTimerTick(60000);
+    flow.tick->setTimerType(Qt::PreciseTimer);
     flow.start();
     flow.post("car/fuel");
-    const int firstRun = flow.tick->timerId();
+    // A restarted timer differs from a running one in nothing but its remaining time.
+    QTRY_VERIFY_WITH_TIMEOUT(flow.tick->remainingTime() < 59700, 5000);
 
     flow.post("car/fuel");
 
-    QVERIFY(flow.tick->isActive());
-    QVERIFY(flow.tick->timerId() != firstRun); // each start gets an id of its own
-    QCOMPARE(flow.tick->interval(), 1000);
+    QVERIFY(flow.tick->remainingTime() > 59700);
     QCOMPARE(messages().take().size(), 1);
 }
 
