@@ -5,6 +5,7 @@
 #include "metadescription.h"
 #include "recordingviewstatetarget.h"
 
+#include <HmiStateMachine/hmi/hmilayeredstate.h>
 #include <HmiStateMachine/hmi/hmisignaltransition.h>
 #include <HmiStateMachine/hmi/hmistate.h>
 #include <HmiStateMachine/named/hmitransition.h>
@@ -95,6 +96,15 @@ private Q_SLOTS:
     void aBlockedKeyIsSwallowed_data();
     void aBlockedKeyIsSwallowed();
     void blockingAKeyTakesTheFirstFreePriority();
+    void inLayersOnlyANamedStateLandsInTheExclusiveLayer();
+    void aStateInLayersStartsWithTheBehaviorOfTheLayers_data();
+    void aStateInLayersStartsWithTheBehaviorOfTheLayers();
+    void aStateInLayersFollowsTheLayers();
+    void aStateInNestedLayersFollowsTheOuterOnes();
+    void anOwnBehaviorInLayersCutsTheInheritanceForGood();
+    void anOwnBehaviorOfTheExclusiveLayerCutsAllItsScreens();
+    void theOtherScreensInLayersFollowOn();
+    void enteringLayersTellsTheBehaviorOfEachState();
 };
 
 void tst_HmiState::itsMetaObjectIsAsPublished()
@@ -582,6 +592,133 @@ void tst_HmiState::blockingAKeyTakesTheFirstFreePriority()
     QVERIFY(unpublished->makeParallelExclusive(2));
     QVERIFY(blocking.first()->makeParallelExclusive(3));
     QVERIFY(!blocking.first()->targetState());
+}
+
+void tst_HmiState::inLayersOnlyANamedStateLandsInTheExclusiveLayer()
+{
+    HmiLayeredState layers("Layers");
+
+    const auto *named = new HmiState("Named", &layers);
+    const auto *unnamed = new HmiState(&layers);
+    const HmiState *unhashed = HmiState::createWithoutHashing("Unhashed", &layers);
+
+    QCOMPARE(named->parent(), layers.exclusiveState());
+    QCOMPARE(unnamed->parent(), &layers);
+    QCOMPARE(unhashed->parent(), &layers);
+}
+
+void tst_HmiState::aStateInLayersStartsWithTheBehaviorOfTheLayers_data()
+{
+    QTest::addColumn<int>("behavior");
+
+    QTest::newRow("default") << 0;
+    QTest::newRow("off") << 1;
+    QTest::newRow("on") << 2;
+    QTest::newRow("beyond the named ones") << 7;
+}
+
+void tst_HmiState::aStateInLayersStartsWithTheBehaviorOfTheLayers()
+{
+    QFETCH(int, behavior);
+    HmiLayeredState layers("Layers");
+    layers.setPopupBehavior(Behavior(behavior));
+
+    const auto *named = new HmiState("Named", &layers);
+    const auto *unnamed = new HmiState(&layers);
+
+    QCOMPARE(int(layers.exclusiveState()->popupBehavior()), behavior);
+    QCOMPARE(int(named->popupBehavior()), behavior);
+    QCOMPARE(int(unnamed->popupBehavior()), behavior);
+}
+
+void tst_HmiState::aStateInLayersFollowsTheLayers()
+{
+    HmiLayeredState layers("Layers");
+    auto *named = new HmiState("Named", &layers);
+    auto *unnamed = new HmiState(&layers);
+    QSignalSpy changes(named, &HmiState::popupBehaviorChanged);
+    QVERIFY(changes.isValid());
+
+    layers.setPopupBehavior(HmiState::PopupBehaviorOn);
+    layers.setPopupBehavior(HmiState::PopupBehaviorOff);
+
+    QCOMPARE(named->popupBehavior(), HmiState::PopupBehaviorOff);
+    QCOMPARE(unnamed->popupBehavior(), HmiState::PopupBehaviorOff);
+    QCOMPARE(changes.size(), 2);
+    QCOMPARE(changes.at(0).first().toInt(), 2);
+    QCOMPARE(changes.at(1).first().toInt(), 1);
+}
+
+void tst_HmiState::aStateInNestedLayersFollowsTheOuterOnes()
+{
+    HmiLayeredState outer("Outer");
+    auto *inner = new HmiLayeredState("Inner", &outer);
+    auto *screen = new HmiState("Screen", inner);
+
+    outer.setPopupBehavior(HmiState::PopupBehaviorOn);
+
+    QCOMPARE(inner->popupBehavior(), HmiState::PopupBehaviorOn);
+    QCOMPARE(screen->popupBehavior(), HmiState::PopupBehaviorOn);
+}
+
+void tst_HmiState::anOwnBehaviorInLayersCutsTheInheritanceForGood()
+{
+    HmiLayeredState layers("Layers");
+    auto *screen = new HmiState("Screen", &layers);
+    auto *unnamed = new HmiState(&layers);
+
+    for (HmiState *child : {screen, unnamed}) {
+        child->setPopupBehavior(HmiState::PopupBehaviorOff);
+    }
+    layers.setPopupBehavior(HmiState::PopupBehaviorOn);
+    layers.setPopupBehavior(HmiState::DefaultPopupBehavior);
+    layers.setPopupBehavior(HmiState::PopupBehaviorOn);
+
+    QCOMPARE(screen->popupBehavior(), HmiState::PopupBehaviorOff);
+    QCOMPARE(unnamed->popupBehavior(), HmiState::PopupBehaviorOff);
+}
+
+void tst_HmiState::anOwnBehaviorOfTheExclusiveLayerCutsAllItsScreens()
+{
+    HmiLayeredState layers("Layers");
+    auto *screen = new HmiState("Screen", &layers);
+
+    layers.exclusiveState()->setPopupBehavior(HmiState::PopupBehaviorOn);
+    layers.setPopupBehavior(HmiState::PopupBehaviorOff);
+
+    QCOMPARE(screen->popupBehavior(), HmiState::PopupBehaviorOn);
+}
+
+void tst_HmiState::theOtherScreensInLayersFollowOn()
+{
+    HmiLayeredState layers("Layers");
+    auto *own = new HmiState("Own", &layers);
+    auto *following = new HmiState("Following", &layers);
+
+    own->setPopupBehavior(HmiState::PopupBehaviorOff);
+    layers.setPopupBehavior(HmiState::PopupBehaviorOn);
+
+    QCOMPARE(own->popupBehavior(), HmiState::PopupBehaviorOff);
+    QCOMPARE(following->popupBehavior(), HmiState::PopupBehaviorOn);
+}
+
+void tst_HmiState::enteringLayersTellsTheBehaviorOfEachState()
+{
+    Journal journal;
+    RecordingViewStateTarget target(journal);
+    target.recordPopupBehavior(true);
+    QStateMachine machine;
+    auto *layers = new HmiLayeredState("Layers", &machine);
+    auto *screen = new HmiState("Screen", layers);
+    layers->setInitialHmiState(screen);
+    layers->setPopupBehavior(HmiState::PopupBehaviorOff);
+    screen->setPopupBehavior(HmiState::PopupBehaviorOn);
+
+    startIn(machine, layers);
+
+    QCOMPARE(journal.lines(),
+             QStringList({"setScreenPopupBehavior false", "setScreenPopupBehavior false",
+                          "setScreenPopupBehavior false", "setScreenPopupBehavior true"}));
 }
 
 QTEST_GUILESS_MAIN(tst_HmiState)
