@@ -1,4 +1,5 @@
 hmi_add_test(hmi hmibacktransition)
+hmi_add_test(hmi hmiconditionalstate)
 hmi_add_test(hmi hmidelayedsignaltransition)
 hmi_add_test(hmi hmilayeredstate)
 hmi_add_test(hmi hmisignaltransition)
