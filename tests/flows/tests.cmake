@@ -1,5 +1,6 @@
 hmi_add_test(flows arbitration)
 hmi_add_test(flows backnavigation)
+hmi_add_test(flows fallbackviews)
 hmi_add_test(flows keyhandling)
-hmi_add_test(flows viewrequest)
 hmi_add_test(flows popuprequest)
+hmi_add_test(flows viewrequest)
