@@ -71,6 +71,7 @@ private Q_SLOTS:
     void theInitialStateIsThatOfTheExclusiveLayer();
     void noInitialStateAtFirst();
     void aPopupIsRefusedAsInitialState();
+    void aPopupAmongTheScreensIsRefusedAsInitialState();
     void aPopupIsRefusedThroughTheOtherSetterToo();
     void aStateFromElsewhereIsRefusedAsInitialState();
     void theInitialStateMayBeTakenBack();
@@ -264,6 +265,21 @@ void tst_HmiLayeredState::aPopupIsRefusedAsInitialState()
     QCOMPARE(messages().take(), QStringList(popupRefused));
     QCOMPARE(state.initialHmiState(), screen);
     QCOMPARE(state.popupState()->initialState(), state.popupState()->noPopupState());
+}
+
+// There Qt itself would take it.
+void tst_HmiLayeredState::aPopupAmongTheScreensIsRefusedAsInitialState()
+{
+    HmiLayeredState state("Layers");
+    auto *screen = new HmiState("Screen", &state);
+    state.setInitialHmiState(screen);
+    auto *popup = new PopupState("layers/moved", 3);
+    popup->setParent(state.exclusiveState());
+
+    state.setInitialHmiState(popup);
+
+    QCOMPARE(messages().take(), QStringList(popupRefused));
+    QCOMPARE(state.initialHmiState(), screen);
 }
 
 void tst_HmiLayeredState::aPopupIsRefusedThroughTheOtherSetterToo()
