@@ -1,5 +1,7 @@
 #include "flow/flow.h"
 #include "hardkeys.h"
+#include "messages.h"
+#include "rules.h"
 #include "scenario/commands.h"
 #include "scenario/scenariofile.h"
 #include "scenario/scenarioparser.h"
@@ -25,6 +27,8 @@ namespace {
 enum ExitCode { Success = 0, ScenarioFailed = 1, UsageError = 2 };
 
 const QCommandLineOption scenarioOption("scenario", "The scenario to run.", "FILE");
+const QCommandLineOption rulesOption("rules", "The popups' rules, in place of the built-in ones.",
+                                     "FILE", builtInRules());
 const QCommandLineOption listOption("list", "List the views and exit.");
 const QCommandLineOption verboseOption("verbose", "Show the library's debug messages.");
 const QCommandLineOption helpOption({"h", "help"}, "Show this help and exit.");
@@ -42,7 +46,7 @@ void describe(QCommandLineParser *parser)
                                       "and tells what its view layer was told.\n\n"
                                       "A scenario is a text file, one command a line:\n"
                                       + commandHelp());
-    parser->addOptions({scenarioOption, listOption, verboseOption, helpOption});
+    parser->addOptions({scenarioOption, rulesOption, listOption, verboseOption, helpOption});
     parser->addPositionalArgument("FILE", "The scenario to run.", "[FILE]");
 }
 
@@ -59,6 +63,7 @@ void setLogging(bool verbose)
         QString("vosk.hmistatemachine.debug=%1\nhmi.performance.debug=%1\nhmi.trace.debug=%1")
             .arg(debug));
     HmiStateMachine::NamedState::setLoggingEnabled(verbose);
+    hidePopupTraces();
 }
 
 std::optional<LocatedFault> runScenario(const QString &path, const Stage &stage)
@@ -92,10 +97,13 @@ ExitCode report(const QString &file, const std::optional<LocatedFault> &fault,
     return Success;
 }
 
-int drive(const QStringList &files, bool list)
+int drive(const QStringList &files, const QString &rules, bool list)
 {
     Transcript transcript(stdout);
     ViewLayer viewLayer(transcript);
+    if (const auto fault = loadRules(rules)) {
+        return report(rules, fault, transcript);
+    }
     Vehicle vehicle;
     HardKeys keys;
     buildFlow({&vehicle, &keys, &viewLayer});
@@ -132,5 +140,5 @@ int main(int argc, char *argv[])
                               .arg(files.size()));
     }
     setLogging(parser.isSet(verboseOption));
-    return drive(files, list);
+    return drive(files, parser.value(rulesOption), list);
 }

@@ -72,8 +72,17 @@ void Vehicle::setSpeed(int speed)
     if (speed == m_speed) {
         return;
     }
+    const bool wasMoving = isMoving();
     m_speed = speed;
     Q_EMIT speedChanged(speed);
+    if (isMoving() != wasMoving) {
+        Q_EMIT movingChanged(isMoving());
+    }
+}
+
+bool Vehicle::isMoving() const
+{
+    return m_speed > walkingPace;
 }
 
 QString Vehicle::gear() const
@@ -128,7 +137,9 @@ QStringList Vehicle::propertyNames()
     QStringList names;
     const QMetaObject &meta = staticMetaObject;
     for (int i = meta.propertyOffset(); i < meta.propertyCount(); ++i) {
-        names.append(QString::fromLatin1(meta.property(i).name()));
+        if (meta.property(i).isWritable()) {
+            names.append(QString::fromLatin1(meta.property(i).name()));
+        }
     }
     return names;
 }

@@ -6,6 +6,9 @@
 
 namespace headunit {
 
+/** Up to this speed, in kilometres per hour, the driver may watch and type. */
+constexpr int walkingPace = 5;
+
 /** The simulated vehicle: properties that tell of their changes, as a real one's interface would.
  */
 class Vehicle : public QObject
@@ -13,6 +16,7 @@ class Vehicle : public QObject
     Q_OBJECT
     Q_PROPERTY(bool ready READ ready WRITE setReady NOTIFY readyChanged)
     Q_PROPERTY(int speed READ speed WRITE setSpeed NOTIFY speedChanged)
+    Q_PROPERTY(bool moving READ isMoving NOTIFY movingChanged)
     Q_PROPERTY(QString gear READ gear WRITE setGear NOTIFY gearChanged)
     Q_PROPERTY(int fuel READ fuel WRITE setFuel NOTIFY fuelChanged)
     Q_PROPERTY(bool phoneConnected READ phoneConnected WRITE setPhoneConnected NOTIFY
@@ -29,6 +33,9 @@ public:
     int speed() const;
     void setSpeed(int speed);
 
+    /** Faster than the driver may watch and type; follows the speed. */
+    bool isMoving() const;
+
     /** "P", "R", "N" or "D". */
     QString gear() const;
     void setGear(const QString &gear);
@@ -41,7 +48,7 @@ public:
     bool phoneConnected() const;
     void setPhoneConnected(bool connected);
 
-    /** The properties that a scenario can set. */
+    /** The properties that a scenario can set: all but those that follow others. */
     static QStringList propertyNames();
 
     /** The values that @p property takes, in words: "a whole number from 0 to 300". */
@@ -54,6 +61,7 @@ Q_SIGNALS:
     /** The systems have come up; follows readyChanged(). */
     void systemReady();
     void speedChanged(int speed);
+    void movingChanged(bool moving);
     void gearChanged(const QString &gear);
     void fuelChanged(int fuel);
     void phoneConnectedChanged(bool connected);

@@ -5,7 +5,10 @@
 
 #include <HmiStateMachine/hmi/hmiviewstate.h>
 #include <HmiStateMachine/named/hmibackevent.h>
+#include <HmiStateMachine/named/popupevent.h>
 #include <HmiStateMachine/named/statemachine.h>
+#include <HmiStateMachine/popup/popupstate.h>
+#include <HmiStateMachine/popup/popuptimeoutmonitor.h>
 
 #include <QMap>
 #include <QStringList>
@@ -17,10 +20,17 @@ namespace headunit {
 
 namespace {
 
+constexpr int timeStepMs = 100;
+
 const QStringList &domains()
 {
     static const QStringList list{"Home", "Media", "Phone", "Navigation", "Settings"};
     return list;
+}
+
+void request(const PopupState *popup)
+{
+    StateMachine::instance()->postEvent(new PopupEvent(popup->name(), QVariant()));
 }
 
 } // namespace
@@ -60,11 +70,43 @@ void ViewLayer::preparePopup(const QString &popupId, bool reactivation)
 void ViewLayer::requestPopupShow(const QString &popupId, int popupKind, const QVariant &data)
 {
     m_transcript.call("show", popupId + ' ' + QString::number(popupKind), data);
+    m_popups.show(popupId);
+    Q_EMIT popupStatusChanged(popupId, true);
+    showTimeLeft(data);
 }
 
 void ViewLayer::requestPopupHide(const QString &popupId, bool deactivated)
 {
     m_transcript.call("hide", popupId, deactivated);
+    if (m_popups.hide(popupId)) {
+        Q_EMIT popupStatusChanged(popupId, false);
+    }
+    if (!deactivated) {
+        return;
+    }
+    // A popup of the same layer was left when it was covered, and the flow shows it again itself.
+    const QStringList covered = m_popups.takeCoveredBy(popupId);
+    for (const QString &id : covered) {
+        if (isPopupStateActive(id)) {
+            unstackPopup(id);
+        }
+    }
+}
+
+void ViewLayer::stackPopup(const QString &popupId, const QString &stackingPopupId)
+{
+    m_transcript.call("stack", popupId + " behind " + stackingPopupId);
+    m_popups.cover(popupId, stackingPopupId);
+    ViewStateTarget::stackPopup(popupId, stackingPopupId);
+}
+
+// The library takes popups off the stack that are not on it, too, whenever it shows or hides one.
+void ViewLayer::unstackPopup(const QString &popupId)
+{
+    if (stackedPopups().contains(popupId)) {
+        m_transcript.call("unstack", popupId);
+    }
+    ViewStateTarget::unstackPopup(popupId);
 }
 
 int ViewLayer::domainFromName(const QString &domainName)
@@ -84,13 +126,26 @@ Identifier ViewLayer::activeView() const
 
 void ViewLayer::retryBlockedPopup(PopupState *popup)
 {
-    Q_UNUSED(popup)
-    m_transcript.call("retry", "a blocked popup");
+    m_transcript.call("retry", popup->popupViewId());
+    request(popup);
 }
 
 void ViewLayer::releaseBlockedPopups(const QMap<PopupState *, QTime> &blockedPopups)
 {
-    m_transcript.call("release", QString::number(blockedPopups.size()) + " blocked popups");
+    if (blockedPopups.isEmpty()) {
+        return;
+    }
+    // Several may have been refused within a millisecond; the board knows which was first.
+    QStringList released;
+    const QStringList refused = m_popups.refused();
+    for (const QString &id : refused) {
+        PopupState *popup = PopupState::stateForTarget(id);
+        if (blockedPopups.contains(popup)) {
+            released.append(id);
+            request(popup);
+        }
+    }
+    m_transcript.call("release", released.join(", "));
 }
 
 void ViewLayer::postFollowOnBackEvent(quint8 backDepth, const QString &backTargetId,
@@ -124,6 +179,37 @@ void ViewLayer::resetScreenPopupBehavior()
 void ViewLayer::updatePopupData(const QString &popupId, const QVariant &data)
 {
     m_transcript.call("update", popupId, data);
+    showTimeLeft(data);
+}
+
+QStringList ViewLayer::domainNames()
+{
+    return domains();
+}
+
+void ViewLayer::setActiveDomain(const QString &name)
+{
+    const int oldDomain = m_activeDomain;
+    m_activeDomain = domainFromName(name);
+    if (oldDomain != m_activeDomain) {
+        Q_EMIT activeDomainChanged(m_activeDomain, oldDomain);
+    }
+}
+
+QString ViewLayer::popupInFront() const
+{
+    return m_popups.front(stackedPopups());
+}
+
+void ViewLayer::noteRefusal(const QString &popupId)
+{
+    m_transcript.note("refused " + popupId);
+    m_popups.refuse(popupId);
+}
+
+bool ViewLayer::wasRefused(const QString &popupId) const
+{
+    return m_popups.refused().contains(popupId);
 }
 
 void ViewLayer::showStatus(const QString &text)
@@ -143,15 +229,22 @@ void ViewLayer::takeVoiceRequest()
 void ViewLayer::setActiveView(const QString &viewId)
 {
     const QString oldView = m_activeView;
-    const int oldDomain = m_activeDomain;
     m_activeView = viewId;
-    m_activeDomain = domainFromName(viewId.section('/', 0, 0));
     Q_EMIT viewAboutToBeActivated(oldView, viewId);
-    if (oldDomain != m_activeDomain) {
-        Q_EMIT activeDomainChanged(m_activeDomain, oldDomain);
-    }
+    setActiveDomain(viewId.section('/', 0, 0));
     Q_EMIT activeViewChanged(viewId, oldView);
     Q_EMIT viewActivated(oldView, viewId);
+}
+
+// Told in steps of half the popup's time: a transcript cannot show how a bar shrinks.
+void ViewLayer::showTimeLeft(const QVariant &popupData)
+{
+    const auto *monitor = popupData.toMap().value("timeoutMonitor").value<PopupTimeoutMonitor *>();
+    if (monitor) {
+        m_transcript.note(
+            QString("%1 ms left")
+                .arg(qRound(double(monitor->timeRemaining()) / timeStepMs) * timeStepMs));
+    }
 }
 
 } // namespace headunit

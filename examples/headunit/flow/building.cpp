@@ -2,12 +2,16 @@
 
 #include "viewlayer.h"
 
+#include <HmiStateMachine/hmi/hmilayeredstate.h>
 #include <HmiStateMachine/hmi/hmiviewstate.h>
 #include <HmiStateMachine/named/hmibackevent.h>
 #include <HmiStateMachine/named/hmievent.h>
 #include <HmiStateMachine/named/hmitransition.h>
 #include <HmiStateMachine/named/hmiviewevent.h>
+#include <HmiStateMachine/named/popupevent.h>
 #include <HmiStateMachine/named/statemachine.h>
+#include <HmiStateMachine/popup/popupdismisstransition.h>
+#include <HmiStateMachine/popup/popupstate.h>
 
 using namespace HmiStateMachine;
 
@@ -55,8 +59,8 @@ HmiTransition *onEvent(const QString &event, QState *source)
     return new HmiTransition(event, source);
 }
 
-// The state of all screens is a region of a parallel state. An external transition from there would
-// leave and enter the other regions too, and guidance and audio would start anew.
+// The state of all screens is layered, and a transition of it belongs to its exclusive layer. An
+// external one from there would leave and enter the layer too.
 void leadTo(const QString &target, QAbstractTransition *transition)
 {
     transition->setTransitionType(QAbstractTransition::InternalTransition);
@@ -69,6 +73,24 @@ void tellEntry(const QString &name, ViewLayer *viewLayer)
                      [name, viewLayer] { viewLayer->showStatus("now " + name); });
 }
 
+HmiLayeredState *layer(const QString &name)
+{
+    auto *result = qobject_cast<HmiLayeredState *>(state(name));
+    if (!result) {
+        qFatal("The state named %s is not layered", qPrintable(name));
+    }
+    return result;
+}
+
+PopupState *popup(const QString &name)
+{
+    auto *result = qobject_cast<PopupState *>(state(name));
+    if (!result) {
+        qFatal("The state named %s is no popup", qPrintable(name));
+    }
+    return result;
+}
+
 void requestView(const QString &name)
 {
     StateMachine::instance()->postEvent(new HmiViewEvent(name, QVariant()));
@@ -77,6 +99,17 @@ void requestView(const QString &name)
 void requestBack(unsigned char depth, const QString &target)
 {
     StateMachine::instance()->postEvent(new HmiBackEvent(depth, target));
+}
+
+void requestPopup(const QString &name)
+{
+    StateMachine::instance()->postEvent(new PopupEvent(name, QVariant()));
+}
+
+void dismissPopup(const QString &name)
+{
+    StateMachine::instance()->postEvent(
+        new PopupEvent(name + PopupDismissTransition::dismissEventSigniture, QVariant()));
 }
 
 void raiseEvent(const QString &name)

@@ -8,9 +8,11 @@ class QObject;
 class QState;
 
 namespace HmiStateMachine {
+class HmiLayeredState;
 class HmiTransition;
 class HmiViewState;
 class NamedState;
+class PopupState;
 } // namespace HmiStateMachine
 
 /** The few phrases in which the flow is written. */
@@ -31,6 +33,8 @@ struct Surroundings
 /** The state of that name; a name that no state has is an error of the flow and ends the demo. */
 HmiStateMachine::NamedState *state(const QString &name);
 HmiStateMachine::HmiViewState *view(const QString &name);
+HmiStateMachine::HmiLayeredState *layer(const QString &name);
+HmiStateMachine::PopupState *popup(const QString &name);
 
 /** A view that leads back to wherever it was opened from. */
 HmiStateMachine::HmiViewState *addView(const QString &name, QState *domain);
@@ -54,6 +58,8 @@ void tellEntry(const QString &name, ViewLayer *viewLayer);
 /** What a request by the application itself is posted as. */
 void requestView(const QString &name);
 void requestBack(unsigned char depth, const QString &target = QString());
+void requestPopup(const QString &name);
+void dismissPopup(const QString &name);
 void raiseEvent(const QString &name);
 
 } // namespace headunit

@@ -1,7 +1,9 @@
 #include "flow.h"
 
 #include "parts.h"
+#include "popups.h"
 
+#include <HmiStateMachine/hmi/hmilayeredstate.h>
 #include <HmiStateMachine/hmi/hmiviewstate.h>
 #include <HmiStateMachine/named/statemachine.h>
 
@@ -40,11 +42,12 @@ void addPart(const Part &part, QState *parent)
 
 void addStates(QState *headUnit)
 {
-    auto *screens = new NamedState("Screens", headUnit);
+    auto *screens = new HmiLayeredState("Screens", headUnit);
     for (const Part &domain : domains) {
-        addPart(domain, screens);
+        addPart(domain, screens->exclusiveState());
     }
-    screens->setInitialState(state("Home"));
+    screens->setInitialHmiState(state("Home"));
+    new HmiLayeredState("Alerts", headUnit); // for its popups: it has no screens
     for (const Part &region : regions) {
         addPart(region, headUnit);
     }
@@ -62,6 +65,7 @@ void addTransitions(const Surroundings &surroundings)
         region.addTransitions(surroundings);
     }
     addVoiceTransitions(surroundings);
+    addPopups(surroundings);
 }
 
 } // namespace

@@ -9,8 +9,9 @@ namespace headunit {
  *
  * @code
  * HeadUnit            parallel: all regions run at the same time
- *   Screens           one view at a time, grouped by domain
+ *   Screens           layered: one view at a time, grouped by domain, and popups over them
  *     Home Media Phone Navigation Settings
+ *   Alerts            layered: popups that concern driving, over all others
  *   Guidance          route guidance, whatever is on the screen
  *   Audio             what is heard
  *   Keys              the keys beside the screen

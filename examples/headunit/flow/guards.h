@@ -11,9 +11,6 @@ namespace headunit {
 
 class Vehicle;
 
-/** Up to this speed, in kilometres per hour, the driver may watch and type. */
-constexpr int walkingPace = 5;
-
 /**
  * Lets @p transition, which allows by default, pass only while @p condition holds. Several guards
  * may be set: a refusal is final.

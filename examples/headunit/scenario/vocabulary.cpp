@@ -3,8 +3,10 @@
 #include "flow/building.h"
 #include "hardkeys.h"
 #include "vehicle.h"
+#include "viewlayer.h"
 
 #include <HmiStateMachine/hmi/hmiviewstate.h>
+#include <HmiStateMachine/popup/popupstate.h>
 
 #include <QRegularExpression>
 #include <QVector>
@@ -60,11 +62,20 @@ int distance(const QString &from, const QString &to)
 
 QStringList requestableNames()
 {
-    QStringList names = viewStateNames() + viewIds();
-    const auto domains =
-        state("Screens")->findChildren<NamedState *>(QString(), Qt::FindDirectChildrenOnly);
-    for (const NamedState *domain : domains) {
-        names.append(domain->name());
+    const QStringList names = viewStateNames() + viewIds();
+    return sortedWithoutDuplicates(names + ViewLayer::domainNames());
+}
+
+// The state that stands for no popup in each layer is none to ask for.
+QStringList popupNames()
+{
+    QStringList names;
+    const auto states = NamedState::namedStates();
+    for (const NamedState *state : states) {
+        if (qobject_cast<const PopupState *>(state)
+            && !state->name().endsWith(PopupState::noneStatePostfix())) {
+            names.append(state->name());
+        }
     }
     return sortedWithoutDuplicates(names);
 }

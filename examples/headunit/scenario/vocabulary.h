@@ -10,6 +10,9 @@ namespace headunit {
  */
 QStringList requestableNames();
 
+/** The popups that may be requested, by state. */
+QStringList popupNames();
+
 /** The ids that the view layer may be told to show. */
 QStringList viewIds();
 
