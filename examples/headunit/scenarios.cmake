@@ -76,4 +76,4 @@ set_tests_properties(headunit-help headunit-verbose PROPERTIES LABELS examples T
 set_tests_properties(headunit-help PROPERTIES
     PASS_REGULAR_EXPRESSION "wait MILLISECONDS.*--scenario <FILE>.*--list")
 set_tests_properties(headunit-verbose PROPERTIES
-    PASS_REGULAR_EXPRESSION "Entering state: \"Unnamed->HeadUnit->Screens->Media->Media/Player\"")
+    PASS_REGULAR_EXPRESSION "Entering state: \"Unnamed->HeadUnit->Screens->Internal->Exclusive->Media->Media/Player\"")

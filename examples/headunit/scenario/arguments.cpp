@@ -39,6 +39,15 @@ QString Arguments::name(const QString &what, const QStringList &known)
     return QString();
 }
 
+QStringList Arguments::names(const QString &what, const QStringList &known)
+{
+    QStringList result;
+    do {
+        result.append(name(what, known));
+    } while (!atEnd());
+    return result;
+}
+
 int Arguments::number(const QString &what, int minimum, int maximum)
 {
     const QString text = takeWord();

@@ -24,6 +24,9 @@ public:
     bool atEnd() const;
     QString word(const QString &what);
     QString name(const QString &what, const QStringList &known);
+
+    /** One or more names, to the end of the line. */
+    QStringList names(const QString &what, const QStringList &known);
     int number(const QString &what, int minimum, int maximum);
 
     /** The rest of the line as JSON; @p what may be left out when it is optional. */

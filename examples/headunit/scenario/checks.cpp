@@ -8,6 +8,7 @@
 
 #include <HmiStateMachine/hmi/hmibacktransition.h>
 #include <HmiStateMachine/hmi/hmiviewstate.h>
+#include <HmiStateMachine/popup/popupstate.h>
 
 using namespace HmiStateMachine;
 
@@ -71,12 +72,61 @@ Action expectCalls(Arguments &arguments)
     };
 }
 
+// The view layer goes by view ids, a scenario by the names of the popups.
+QString popupOfId(const QString &id)
+{
+    const PopupState *popup = PopupState::stateForTarget(id);
+    return popup ? popup->name() : nowhere;
+}
+
+QString popupsOfIds(const QStringList &ids)
+{
+    QStringList names;
+    for (const QString &id : ids) {
+        names.append(popupOfId(id));
+    }
+    return names.isEmpty() ? nowhere : names.join(' ');
+}
+
+Action expectPopup(Arguments &arguments)
+{
+    const QString name = arguments.name("the name of a popup or none", popupNames() << nowhere);
+    return [name](Stage &stage) {
+        return compare("the popup in front to be", name,
+                       popupOfId(stage.viewLayer->popupInFront()));
+    };
+}
+
+Action expectStacked(Arguments &arguments)
+{
+    const QStringList names =
+        arguments.names("the names of popups or none", popupNames() << nowhere);
+    if (names.contains(nowhere) && names.size() > 1) {
+        arguments.fail({"none alone or the names of popups", quoted(names.join(' ')), QString()});
+    }
+    return [names](Stage &stage) {
+        return compare("the stacked popups to be", names.join(' '),
+                       popupsOfIds(stage.viewLayer->stackedPopups()), "the oldest comes first");
+    };
+}
+
+Action expectBlocked(Arguments &arguments)
+{
+    const QString name = arguments.name("the name of a popup", popupNames());
+    return [name](Stage &stage) {
+        const bool refused = stage.viewLayer->wasRefused(popup(name)->popupViewId());
+        return compare("popup " + name + " to be", "blocked", refused ? "blocked" : "not blocked",
+                       "blocked is what was refused and not shown since");
+    };
+}
+
 } // namespace
 
 Action parseExpect(Arguments &arguments)
 {
     const QString kind =
-        arguments.name("something to expect", {"view", "back", "entered", "left", "calls"});
+        arguments.name("something to expect",
+                       {"view", "back", "entered", "left", "calls", "popup", "stacked", "blocked"});
     if (kind == "view") {
         return expectView(arguments);
     }
@@ -85,6 +135,15 @@ Action parseExpect(Arguments &arguments)
     }
     if (kind == "calls") {
         return expectCalls(arguments);
+    }
+    if (kind == "popup") {
+        return expectPopup(arguments);
+    }
+    if (kind == "stacked") {
+        return expectStacked(arguments);
+    }
+    if (kind == "blocked") {
+        return expectBlocked(arguments);
     }
     return expectActive(kind == "entered", arguments);
 }

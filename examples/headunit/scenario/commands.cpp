@@ -6,12 +6,15 @@
 #include "hardkeys.h"
 #include "transcript.h"
 #include "vehicle.h"
+#include "viewlayer.h"
 #include "vocabulary.h"
 
 #include <HmiStateMachine/named/hmibackevent.h>
 #include <HmiStateMachine/named/hmievent.h>
 #include <HmiStateMachine/named/hmiviewevent.h>
+#include <HmiStateMachine/named/popupevent.h>
 #include <HmiStateMachine/named/statemachine.h>
+#include <HmiStateMachine/popup/popupdismisstransition.h>
 
 #include <QEventLoop>
 #include <QTimer>
@@ -23,7 +26,10 @@ namespace headunit {
 namespace {
 
 constexpr int maximumDepth = 255;
+constexpr int maximumBurst = 1000;
 constexpr int maximumWaitMs = 10000;
+
+const QString anyPopup = QStringLiteral("any");
 
 std::optional<Fault> post(QEvent *event)
 {
@@ -108,6 +114,43 @@ Action parseVoice(Arguments &arguments)
     return [phrase, data](Stage &) { return post(new HmiEvent(voiceEvent(phrase), data)); };
 }
 
+Action parsePopup(Arguments &arguments)
+{
+    const QString name = arguments.name("the name of a popup", popupNames());
+    const QVariant data = arguments.optionalData();
+    return [name, data](Stage &) { return post(new PopupEvent(name, data)); };
+}
+
+Action parseDismiss(Arguments &arguments)
+{
+    const QString name = arguments.name("the name of a popup or any", popupNames() << anyPopup);
+    const QString target = name == anyPopup ? PopupDismissTransition::dismissEventWildCard
+                                            : name + PopupDismissTransition::dismissEventSigniture;
+    return [target](Stage &) { return post(new PopupEvent(target, QVariant())); };
+}
+
+// All requests are posted before the first of them is carried out.
+Action parseBurst(Arguments &arguments)
+{
+    const int requests = arguments.number("a number of requests", 1, maximumBurst);
+    const QStringList names = arguments.names("the names of popups", popupNames());
+    return [requests, names](Stage &) -> std::optional<Fault> {
+        for (int i = 0; i < requests; ++i) {
+            post(new PopupEvent(names[i % names.size()], QVariantMap{{"number", i + 1}}));
+        }
+        return std::nullopt;
+    };
+}
+
+Action parseDomain(Arguments &arguments)
+{
+    const QString name = arguments.name("the name of a domain", ViewLayer::domainNames());
+    return [name](Stage &stage) -> std::optional<Fault> {
+        stage.viewLayer->setActiveDomain(name);
+        return std::nullopt;
+    };
+}
+
 // The one place where time passes: timers of the flow run out here and nowhere else.
 Action parseWait(Arguments &arguments)
 {
@@ -145,6 +188,13 @@ const QList<CommandDefinition> &commandDefinitions()
         {"event", "event NAME [JSON]", "raise an event", CommandKind::Step, parseEvent},
         {"voice", "voice PHRASE [JSON]", "a phrase that the driver has spoken", CommandKind::Step,
          parseVoice},
+        {"popup", "popup NAME [JSON]", "request a popup", CommandKind::Step, parsePopup},
+        {"dismiss", "dismiss NAME | dismiss any", "dismiss a popup, or whichever are in front",
+         CommandKind::Step, parseDismiss},
+        {"burst", "burst NUMBER NAME...", "so many requests for these popups in turn, all at once",
+         CommandKind::Step, parseBurst},
+        {"domain", "domain NAME", "another domain takes over, without a change of view",
+         CommandKind::Step, parseDomain},
         {"wait", "wait MILLISECONDS", "let time pass", CommandKind::Step, parseWait},
         {"try", "try view NAME [JSON] | try back DEPTH NAME",
          "a request with a name that need not exist", CommandKind::Step, parseTry},
