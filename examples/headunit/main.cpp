@@ -29,6 +29,7 @@ enum ExitCode { Success = 0, ScenarioFailed = 1, UsageError = 2 };
 const QCommandLineOption scenarioOption("scenario", "The scenario to run.", "FILE");
 const QCommandLineOption rulesOption("rules", "The popups' rules, in place of the built-in ones.",
                                      "FILE", builtInRules());
+const QCommandLineOption firstStartOption("first-start", "Start as out of the factory.");
 const QCommandLineOption listOption("list", "List the views and exit.");
 const QCommandLineOption verboseOption("verbose", "Show the library's debug messages.");
 const QCommandLineOption helpOption({"h", "help"}, "Show this help and exit.");
@@ -46,7 +47,8 @@ void describe(QCommandLineParser *parser)
                                       "and tells what its view layer was told.\n\n"
                                       "A scenario is a text file, one command a line:\n"
                                       + commandHelp());
-    parser->addOptions({scenarioOption, rulesOption, listOption, verboseOption, helpOption});
+    parser->addOptions(
+        {scenarioOption, rulesOption, firstStartOption, listOption, verboseOption, helpOption});
     parser->addPositionalArgument("FILE", "The scenario to run.", "[FILE]");
 }
 
@@ -97,17 +99,19 @@ ExitCode report(const QString &file, const std::optional<LocatedFault> &fault,
     return Success;
 }
 
-int drive(const QStringList &files, const QString &rules, bool list)
+int drive(const QCommandLineParser &parser, const QStringList &files)
 {
     Transcript transcript(stdout);
     ViewLayer viewLayer(transcript);
+    const QString rules = parser.value(rulesOption);
     if (const auto fault = loadRules(rules)) {
         return report(rules, fault, transcript);
     }
     Vehicle vehicle;
+    vehicle.setFirstStart(parser.isSet(firstStartOption));
     HardKeys keys;
     buildFlow({&vehicle, &keys, &viewLayer});
-    if (list) {
+    if (parser.isSet(listOption)) {
         write(stdout, viewStateNames().join('\n'));
         return Success;
     }
@@ -140,5 +144,5 @@ int main(int argc, char *argv[])
                               .arg(files.size()));
     }
     setLogging(parser.isSet(verboseOption));
-    return drive(files, parser.value(rulesOption), list);
+    return drive(parser, files);
 }

@@ -2,12 +2,18 @@ set(scenarios_dir ${CMAKE_CURRENT_SOURCE_DIR}/scenarios)
 set(faults_dir ${CMAKE_CURRENT_SOURCE_DIR}/tests/faults)
 
 # One test for each scenario: it succeeds, and its transcript is that of the .expected file beside
-# it. Both files are found by listing the folder.
+# it. Both files are found by listing the folder. The lines of a .options file are arguments.
 file(GLOB scenarios CONFIGURE_DEPENDS ${scenarios_dir}/*.scenario)
 foreach(scenario IN LISTS scenarios)
     get_filename_component(name ${scenario} NAME_WE)
+    set(options "")
+    if(EXISTS ${scenarios_dir}/${name}.options)
+        file(STRINGS ${scenarios_dir}/${name}.options options)
+        set_property(DIRECTORY APPEND PROPERTY
+            CMAKE_CONFIGURE_DEPENDS ${scenarios_dir}/${name}.options)
+    endif()
     hmi_add_output_test(scenario-${name}
-        COMMAND headunit ${name}.scenario
+        COMMAND headunit ${options} ${name}.scenario
         EXPECTED ${scenarios_dir}/${name}.expected
         DIRECTORY ${scenarios_dir}
         LABELS scenarios)

@@ -132,6 +132,16 @@ void Vehicle::setPhoneConnected(bool connected)
     Q_EMIT phoneConnectedChanged(connected);
 }
 
+bool Vehicle::isFirstStart() const
+{
+    return m_firstStart;
+}
+
+void Vehicle::setFirstStart(bool first)
+{
+    m_firstStart = first;
+}
+
 QStringList Vehicle::propertyNames()
 {
     QStringList names;

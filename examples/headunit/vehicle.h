@@ -48,6 +48,10 @@ public:
     bool phoneConnected() const;
     void setPhoneConnected(bool connected);
 
+    /** Nobody has chosen a language yet. */
+    bool isFirstStart() const;
+    void setFirstStart(bool first);
+
     /** The properties that a scenario can set: all but those that follow others. */
     static QStringList propertyNames();
 
@@ -69,6 +73,7 @@ Q_SIGNALS:
 private:
     Q_DISABLE_COPY(Vehicle)
 
+    bool m_firstStart = false;
     bool m_ready = false;
     int m_speed = 0;
     QString m_gear = QStringLiteral("P");

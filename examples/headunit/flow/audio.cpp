@@ -55,7 +55,7 @@ void followCall(Vehicle *vehicle)
 
 } // namespace
 
-void addAudioStates(QState *region)
+void addAudioStates(QState *region, const Surroundings &)
 {
     for (const char *name : withoutCall) {
         new NamedState(name, region);

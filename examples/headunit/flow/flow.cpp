@@ -16,16 +16,17 @@ namespace {
 struct Part
 {
     const char *name;
-    void (*addStates)(QState *);
+    void (*addStates)(QState *, const Surroundings &);
     void (*addTransitions)(const Surroundings &);
 };
 
+// A fallback view looks up at once where it falls back to: the settings come before the phone.
 const Part domains[] = {
     {"Home", addHomeViews, addHomeTransitions},
     {"Media", addMediaViews, addMediaTransitions},
+    {"Settings", addSettingsViews, addSettingsTransitions},
     {"Phone", addPhoneViews, addPhoneTransitions},
     {"Navigation", addNavigationViews, addNavigationTransitions},
-    {"Settings", addSettingsViews, addSettingsTransitions},
 };
 
 const Part regions[] = {
@@ -33,23 +34,23 @@ const Part regions[] = {
     {"Audio", addAudioStates, addAudioTransitions},
 };
 
-// A domain is a plain named state: only views announce a popup behaviour to the view layer.
-void addPart(const Part &part, QState *parent)
+// A domain is a plain named state: it announces no popup behaviour to the view layer.
+void addPart(const Part &part, QState *parent, const Surroundings &surroundings)
 {
     auto *region = new NamedState(part.name, parent);
-    part.addStates(region);
+    part.addStates(region, surroundings);
 }
 
-void addStates(QState *headUnit)
+void addStates(QState *headUnit, const Surroundings &surroundings)
 {
     auto *screens = new HmiLayeredState("Screens", headUnit);
     for (const Part &domain : domains) {
-        addPart(domain, screens->exclusiveState());
+        addPart(domain, screens->exclusiveState(), surroundings);
     }
     screens->setInitialHmiState(state("Home"));
     new HmiLayeredState("Alerts", headUnit); // for its popups: it has no screens
     for (const Part &region : regions) {
-        addPart(region, headUnit);
+        addPart(region, headUnit, surroundings);
     }
     new NamedState("Keys", headUnit);
 }
@@ -74,7 +75,7 @@ void buildFlow(const Surroundings &surroundings)
 {
     StateMachine *machine = StateMachine::instance();
     auto *headUnit = new NamedState("HeadUnit", QState::ParallelStates, machine);
-    addStates(headUnit);
+    addStates(headUnit, surroundings);
     addTransitions(surroundings);
     machine->setInitialState(headUnit);
 

@@ -50,7 +50,7 @@ void answerOffer()
 
 } // namespace
 
-void addGuidanceStates(QState *region)
+void addGuidanceStates(QState *region, const Surroundings &)
 {
     region->setInitialState(new NamedState("Guidance/Idle", region));
     new NamedState("Guidance/Running", region);

@@ -3,6 +3,7 @@
 #include "building.h"
 #include "guards.h"
 #include "hardkeys.h"
+#include "startup.h"
 #include "vehicle.h"
 
 #include <HmiStateMachine/hmi/hmidelayedsignaltransition.h>
@@ -65,7 +66,7 @@ void switchDisplayOff()
 
 } // namespace
 
-void addHomeViews(QState *domain)
+void addHomeViews(QState *domain, const Surroundings &)
 {
     HmiViewState *welcome = addViewWithoutBack("Home/Welcome", domain);
     HmiViewState *main = addViewWithoutBack("Home/Main", domain); // back ends here
@@ -74,7 +75,7 @@ void addHomeViews(QState *domain)
     HmiViewState *standby = addViewWithoutBack("Home/Standby", domain);
 
     apps->createDirectBackTransition(main);
-    domain->setInitialState(welcome);
+    addStartUpStates(domain);
 
     // Nobody wants to be led back to these.
     welcome->setHasBackStackPresence(false);
@@ -84,6 +85,7 @@ void addHomeViews(QState *domain)
 
 void addHomeTransitions(const Surroundings &surroundings)
 {
+    addStartUpTransitions(surroundings);
     showWelcomeForAWhile(surroundings.vehicle);
     showCameraInReverse(surroundings.vehicle);
     keepCameraInFront(surroundings.keys);

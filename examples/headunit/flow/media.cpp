@@ -67,7 +67,7 @@ void closeVideoWhenMoving(Vehicle *vehicle)
 
 } // namespace
 
-void addMediaViews(QState *domain)
+void addMediaViews(QState *domain, const Surroundings &)
 {
     HmiViewState *sources = addView("Media/Sources", domain);
     addConnectingView(domain);

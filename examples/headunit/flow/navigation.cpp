@@ -50,7 +50,7 @@ void planRoute()
 
 } // namespace
 
-void addNavigationViews(QState *domain)
+void addNavigationViews(QState *domain, const Surroundings &)
 {
     HmiViewState *map = addView("Navigation/Map", domain);
     HmiViewState *destination = addViewWithoutBack("Navigation/Destination", domain);

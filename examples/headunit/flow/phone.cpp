@@ -7,6 +7,7 @@
 #include "vehicle.h"
 #include "viewlayer.h"
 
+#include <HmiStateMachine/hmi/hmipropertyboundfallbackviewstate.h>
 #include <HmiStateMachine/hmi/hmiviewstate.h>
 #include <HmiStateMachine/named/guardedpropertychangetransition.h>
 #include <HmiStateMachine/named/hmitransition.h>
@@ -68,19 +69,33 @@ void dialContacts(const Vehicle *vehicle, ViewLayer *viewLayer)
                      [viewLayer] { viewLayer->showStatus("no phone connected"); });
 }
 
-// From any view of the domain: there is nothing to see here without a phone.
+// Without a phone there are no favourites: however they are asked for, the devices are shown in
+// their place, and the view layer hears no more of them than that they were left.
+HmiViewState *addFavourites(QState *domain, Vehicle *vehicle)
+{
+    auto *favourites = new HmiPropertyBoundFallbackViewState(
+        "Phone/Favourites", "Settings/Devices", vehicle, "phoneConnected", {true}, domain, true);
+    favourites->setHandlesBackEvent(true);
+    return favourites;
+}
+
+// From any view of the domain: there is nothing to see here without a phone. The favourites give
+// way by themselves.
 void leaveWithoutPhone(Vehicle *vehicle)
 {
     auto *lost = new GuardedPropertyChangeTransition(vehicle, "phoneConnected", {true}, false,
                                                      state("Phone"));
     lost->setTargetState(state("Settings/Devices"));
+    const NamedState *favourites = state("Phone/Favourites");
+    QObject::connect(lost, &GuardedSignalTransition::transitionTest, lost,
+                     [lost, favourites] { lost->setAllowTransition(!favourites->isActive()); });
 }
 
 } // namespace
 
-void addPhoneViews(QState *domain)
+void addPhoneViews(QState *domain, const Surroundings &surroundings)
 {
-    HmiViewState *favourites = addView("Phone/Favourites", domain);
+    HmiViewState *favourites = addFavourites(domain, surroundings.vehicle);
     HmiViewState *contacts = addView("Phone/Contacts", domain);
     HmiViewState *details = addViewWithoutBack("Phone/ContactDetails", domain);
     HmiViewState *incoming = addView("Phone/Incoming", domain);

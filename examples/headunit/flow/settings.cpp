@@ -34,7 +34,7 @@ void stayDuringUpdate(HardKeys *keys)
 
 } // namespace
 
-void addSettingsViews(QState *domain)
+void addSettingsViews(QState *domain, const Surroundings &)
 {
     HmiViewState *main = addView("Settings/Main", domain);
     domain->setInitialState(main);
