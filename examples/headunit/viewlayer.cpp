@@ -20,12 +20,22 @@ namespace headunit {
 
 namespace {
 
-constexpr int timeStepMs = 100;
+constexpr int timeStepMs = 200;
 
 const QStringList &domains()
 {
     static const QStringList list{"Home", "Media", "Phone", "Navigation", "Settings"};
     return list;
+}
+
+const QString monitorKey = QStringLiteral("timeoutMonitor");
+
+// An object is nothing to be printed.
+QVariant printable(const QVariant &popupData)
+{
+    QVariantMap map = popupData.toMap();
+    map.remove(monitorKey);
+    return map;
 }
 
 void request(const PopupState *popup)
@@ -69,7 +79,7 @@ void ViewLayer::preparePopup(const QString &popupId, bool reactivation)
 
 void ViewLayer::requestPopupShow(const QString &popupId, int popupKind, const QVariant &data)
 {
-    m_transcript.call("show", popupId + ' ' + QString::number(popupKind), data);
+    m_transcript.call("show", popupId + ' ' + QString::number(popupKind), printable(data));
     m_popups.show(popupId);
     Q_EMIT popupStatusChanged(popupId, true);
     showTimeLeft(data);
@@ -178,7 +188,7 @@ void ViewLayer::resetScreenPopupBehavior()
 
 void ViewLayer::updatePopupData(const QString &popupId, const QVariant &data)
 {
-    m_transcript.call("update", popupId, data);
+    m_transcript.call("update", popupId, printable(data));
     showTimeLeft(data);
 }
 
@@ -236,10 +246,10 @@ void ViewLayer::setActiveView(const QString &viewId)
     Q_EMIT viewActivated(oldView, viewId);
 }
 
-// Told in steps of half the popup's time: a transcript cannot show how a bar shrinks.
+// Told in coarse steps: a transcript, which is the same each time, cannot show how a bar shrinks.
 void ViewLayer::showTimeLeft(const QVariant &popupData)
 {
-    const auto *monitor = popupData.toMap().value("timeoutMonitor").value<PopupTimeoutMonitor *>();
+    const auto *monitor = popupData.toMap().value(monitorKey).value<PopupTimeoutMonitor *>();
     if (monitor) {
         m_transcript.note(
             QString("%1 ms left")
