@@ -48,7 +48,7 @@ void addStates(QState *headUnit, const Surroundings &surroundings)
         addPart(domain, screens->exclusiveState(), surroundings);
     }
     screens->setInitialHmiState(state("Home"));
-    new HmiLayeredState("Alerts", headUnit); // for its popups: it has no screens
+    new HmiLayeredState("Alerts", headUnit); // has no screens, but popups
     for (const Part &region : regions) {
         addPart(region, headUnit, surroundings);
     }

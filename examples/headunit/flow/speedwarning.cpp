@@ -2,7 +2,7 @@
 #include "popups.h"
 #include "vehicle.h"
 
-#include <HmiStateMachine/named/hmitransition.h>
+#include <HmiStateMachine/hmi/hmilayeredstate.h>
 #include <HmiStateMachine/named/intsignaltransition.h>
 #include <HmiStateMachine/named/namedstate.h>
 
@@ -13,23 +13,30 @@ namespace headunit {
 namespace {
 
 constexpr int speedLimit = 130;
+const char *const warning = "car/speed";
 
-// Neither has a target: that a popup comes or goes moves no other state.
-void onSpeed(IntSignalTransition::Operator comparison, Vehicle *vehicle,
-             void (*action)(const QString &))
+void onSpeed(IntSignalTransition::Operator comparison, Vehicle *vehicle, NamedState *from,
+             NamedState *to)
 {
-    auto *transition = new IntSignalTransition(vehicle, SIGNAL(speedChanged(int)), speedLimit,
-                                               comparison, state("Keys"));
-    QObject::connect(transition, &QAbstractTransition::triggered, transition,
-                     [action] { action("car/speed"); });
+    auto *transition =
+        new IntSignalTransition(vehicle, SIGNAL(speedChanged(int)), speedLimit, comparison, from);
+    transition->setTargetState(to);
 }
 
 } // namespace
 
+// The popup follows a state: it is requested once, however often the speed changes above the limit.
 void warnOfSpeed(const Surroundings &surroundings)
 {
-    onSpeed(IntSignalTransition::Less, surroundings.vehicle, requestPopup);
-    onSpeed(IntSignalTransition::GreaterOrEqual, surroundings.vehicle, dismissPopup);
+    HmiLayeredState *alerts = layer("Alerts");
+    auto *allowed = new NamedState("Speed/Allowed", alerts->exclusiveState());
+    auto *exceeded = new NamedState("Speed/Exceeded", alerts->exclusiveState());
+    alerts->setInitialHmiState(allowed);
+
+    onSpeed(IntSignalTransition::Less, surroundings.vehicle, allowed, exceeded);
+    onSpeed(IntSignalTransition::GreaterOrEqual, surroundings.vehicle, exceeded, allowed);
+    QObject::connect(exceeded, &QAbstractState::entered, exceeded, [] { requestPopup(warning); });
+    QObject::connect(exceeded, &QAbstractState::exited, exceeded, [] { dismissPopup(warning); });
 }
 
 } // namespace headunit
