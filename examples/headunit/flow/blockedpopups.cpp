@@ -10,13 +10,17 @@ using namespace HmiStateMachine;
 
 namespace headunit {
 
+namespace {
+
 // Not to store them any longer hands them to the view layer, which requests them again. Those that
 // are refused once more are kept for the next time.
-static void releaseBlockedPopups()
+void releaseBlockedPopups()
 {
     PopupState::setStoreBlockedPopups(false);
     PopupState::setStoreBlockedPopups(true);
 }
+
+} // namespace
 
 void keepBlockedPopups(const Surroundings &surroundings)
 {
