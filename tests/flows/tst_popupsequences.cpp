@@ -2,6 +2,7 @@
 #include "emitter.h"
 #include "librarytest.h"
 #include "popupflow.h"
+#include "popupsettings.h"
 
 #include <HmiStateMachine/hmi/hmilayeredstate.h>
 #include <HmiStateMachine/hmi/hmiviewstate.h>
@@ -31,26 +32,6 @@ const QStringList warnShown = {"requestPopupShow WarnView 5", "unstackPopup Warn
 const QStringList warnGoes = {"requestPopupHide WarnView true", "unstackPopup WarnView"};
 const QStringList prepareCall = {"preparePopup CallView false"};
 const QStringList prepareWarn = {"preparePopup WarnView false"};
-
-/** Refused popups are kept while this lives. */
-struct StoringBlocked
-{
-    StoringBlocked() { PopupState::setStoreBlockedPopups(true); }
-    ~StoringBlocked() { PopupState::setStoreBlockedPopups(false); }
-};
-
-/** Names no driver restriction any more once it is gone. */
-struct DriverRestriction
-{
-    explicit DriverRestriction(Emitter &emitter)
-    {
-        PopupState::setDriverRestrictionProperty(&emitter, "value", 3);
-    }
-    ~DriverRestriction()
-    {
-        PopupState::setDriverRestrictionProperty(nullptr, QByteArray(), QVariant());
-    }
-};
 
 /** Three popups: two of the lower layer, one of the upper. */
 struct ThreePopups : PopupFlow

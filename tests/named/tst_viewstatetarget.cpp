@@ -1,6 +1,7 @@
 #include "driving.h"
 #include "librarytest.h"
 #include "metadescription.h"
+#include "popupflow.h"
 #include "recordingviewstatetarget.h"
 
 #include <HmiStateMachine/named/guardedtransition.h>
@@ -73,6 +74,7 @@ private Q_SLOTS:
     void unstackingKeepsTheOrderOfTheRest();
     void anUnstackedPopupIsStackedAnewAtTheEnd();
     void theListOfStackedPopupsIsACopy();
+    void aPopupIsActiveByItsViewId();
     void thereIsNoVoiceRequestAtFirst();
     void aVoiceRequestIsKeptUntilItIsChanged();
     void aVoiceRequestComesFromTheTransitionThatFires();
@@ -353,6 +355,22 @@ void tst_ViewStateTarget::theListOfStackedPopupsIsACopy()
     list.append("Call");
 
     QCOMPARE(target.stackedPopups(), QList<QString>({"Volume"}));
+}
+
+void tst_ViewStateTarget::aPopupIsActiveByItsViewId()
+{
+    PopupFlow flow(messages());
+    flow.popup("targetactive/fuel", "FuelView");
+    flow.start();
+    QVERIFY(!flow.target.isPopupStateActive("FuelView"));
+
+    flow.request("targetactive/fuel");
+    QVERIFY(flow.target.isPopupStateActive("FuelView"));
+    QVERIFY(!flow.target.isPopupStateActive("targetactive/fuel"));
+    QVERIFY(!flow.target.isPopupStateActive(""));
+
+    flow.request("targetactive/fuel_Dismiss");
+    QVERIFY(!flow.target.isPopupStateActive("FuelView"));
 }
 
 void tst_ViewStateTarget::thereIsNoVoiceRequestAtFirst()
