@@ -36,6 +36,38 @@ struct TwoPopups : PopupFlow
     PopupState *const call;
 };
 
+/** Counts the warnings of Qt's own while it lives, and hands all messages on. */
+class QtWarnings
+{
+public:
+    QtWarnings() : m_previous(qInstallMessageHandler(&QtWarnings::handle)) { s_instance = this; }
+
+    ~QtWarnings()
+    {
+        qInstallMessageHandler(m_previous);
+        s_instance = nullptr;
+    }
+
+    int count() const { return m_count; }
+
+private:
+    Q_DISABLE_COPY(QtWarnings)
+
+    static void handle(QtMsgType type, const QMessageLogContext &context, const QString &text)
+    {
+        if (type == QtWarningMsg && qstrcmp(context.category, "default") == 0) {
+            ++s_instance->m_count;
+        }
+        s_instance->m_previous(type, context, text);
+    }
+
+    static QtWarnings *s_instance;
+    QtMessageHandler m_previous;
+    int m_count = 0;
+};
+
+QtWarnings *QtWarnings::s_instance = nullptr;
+
 } // namespace
 
 class tst_PopupStateLifetime : public LibraryTest
@@ -44,6 +76,8 @@ class tst_PopupStateLifetime : public LibraryTest
 
 private Q_SLOTS:
     void anActivePopupIsRemovedAndDeleted();
+    void aLayerServesOnAfterThePopupRequestedLastIsDeleted_data();
+    void aLayerServesOnAfterThePopupRequestedLastIsDeleted();
     void aWaitingPopupIsDeleted();
     void aStackedPopupIsDeletedWithItsReactions();
     void aPopupThatWasNeverEnteredIsDeleted();
@@ -77,6 +111,39 @@ void tst_PopupStateLifetime::anActivePopupIsRemovedAndDeleted()
     flow.request("DismissAnyPopup");
     flow.request("liferemove/fuel");
     QVERIFY(flow.fuel->isActive());
+}
+
+void tst_PopupStateLifetime::aLayerServesOnAfterThePopupRequestedLastIsDeleted_data()
+{
+    QTest::addColumn<bool>("moved");
+
+    QTest::newRow("deleted in its root") << false;
+    QTest::newRow("deleted in another root") << true;
+}
+
+void tst_PopupStateLifetime::aLayerServesOnAfterThePopupRequestedLastIsDeleted()
+{
+    QFETCH(bool, moved);
+    TwoPopups flow(messages(), "lifelast");
+    PopupState *mail = flow.popup("lifelast/mail", "MailView");
+    lead(QEvent::Type(QEvent::User + 3), flow.fuel, flow.call);
+    flow.start();
+    flow.request("lifelast/fuel");
+    flow.machine.postEvent(new QEvent(QEvent::Type(QEvent::User + 3)));
+    settle();
+    QVERIFY(flow.call->isActive());
+
+    const QtWarnings warnings;
+
+    if (moved) {
+        flow.upper->addPopupState(flow.fuel);
+    }
+    delete flow.fuel;
+    flow.request("CallView_Dismiss");
+    flow.request("lifelast/mail");
+
+    QVERIFY(mail->isActive());
+    QCOMPARE(warnings.count(), 0);
 }
 
 void tst_PopupStateLifetime::aWaitingPopupIsDeleted()

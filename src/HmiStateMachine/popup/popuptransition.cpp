@@ -51,6 +51,10 @@ void PopupTransition::removeTarget(PopupState *popup)
             ++it;
         }
     }
+    // Qt warns of every move of a transition whose target is gone.
+    if (targetState() == popup) {
+        setTargetState(nullptr);
+    }
 }
 
 bool PopupTransition::blockedByStacked(PopupState *popup) const
