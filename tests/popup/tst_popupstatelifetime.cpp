@@ -92,6 +92,8 @@ private Q_SLOTS:
     void aPopupOutlivesItsRoot();
     void aPopupDeletedWhileStackedLeavesNoDanglingDismissal();
     void anActivePopupMovesToAnotherRootWithTheMachineStopped();
+    void anActivePopupMovesToAnotherRootWhileTheMachineRuns();
+    void aStoredPopupMovesToAnotherRoot();
     void aStackedPopupMovesToAnotherRoot();
     void aPopupLeavesItsRootForNone();
     void aDismissedPopupCanBeDeletedInItsSignal();
@@ -358,6 +360,43 @@ void tst_PopupStateLifetime::anActivePopupMovesToAnotherRootWithTheMachineStoppe
     QCOMPARE(flow.upper->activePopupState(), flow.call);
     flow.request("CallView_Dismiss");
     QCOMPARE(flow.upper->activePopupState(), flow.upper->noPopupState());
+}
+
+void tst_PopupStateLifetime::anActivePopupMovesToAnotherRootWhileTheMachineRuns()
+{
+    TwoPopups flow(messages(), "lifemoverun");
+    flow.bringUp();
+
+    flow.upper->addPopupState(flow.call);
+    settle();
+
+    QVERIFY(!flow.call->isActive());
+    QCOMPARE(PopupState::getActivePopupState(), nullptr);
+    QCOMPARE(flow.lower->activePopupState(), flow.lower->noPopupState());
+    flow.request("lifemoverun/call");
+    QCOMPARE(flow.upper->activePopupState(), flow.call);
+    flow.request("lifemoverun/fuel");
+    QVERIFY(flow.fuel->isActive());
+    QVERIFY(flow.call->isActive());
+    flow.request("CallView_Dismiss");
+    QVERIFY(!flow.call->isActive());
+}
+
+void tst_PopupStateLifetime::aStoredPopupMovesToAnotherRoot()
+{
+    TwoPopups flow(messages(), "lifestoredmove");
+    const StoringBlocked storing;
+    PopupFlow::rule("lifestoredmove/fuel", PopupState::Prohibit, "lifestoredmove/call");
+    flow.bringUp();
+    QCOMPARE(flow.call->dismissTransition()->sourceState(), flow.lower);
+
+    flow.upper->addPopupState(flow.call);
+    QCOMPARE(flow.call->dismissTransition()->sourceState(), flow.upper);
+
+    flow.request("CallView_Dismiss");
+    flow.take();
+    PopupState::setStoreBlockedPopups(false);
+    QCOMPARE(flow.take(), QStringList({"releaseBlockedPopups 0"}));
 }
 
 void tst_PopupStateLifetime::aStackedPopupMovesToAnotherRoot()
