@@ -62,6 +62,7 @@ private Q_SLOTS:
     void theTransitionLeadsToNoPopup();
     void aPopupWithoutARootHasATimerButNoTransition();
     void theTransitionIsAddedWithTheRoot();
+    void theTimeoutOfAMovedPopupClosesItInItsNewLayer();
     void switchingOffAndOnReusesTimerAndTransition();
     void switchingOnTwiceConnectsOnce();
     void switchingOffStopsTheTimer();
@@ -135,6 +136,23 @@ void tst_PopupStateAutoDismiss::theTransitionIsAddedWithTheRoot()
 
     QVERIFY(popup->autoDismissTransition());
     QCOMPARE(popup->autoDismissTransition()->targetState(), root.noPopupState());
+}
+
+void tst_PopupStateAutoDismiss::theTimeoutOfAMovedPopupClosesItInItsNewLayer()
+{
+    TimedPopup flow(messages(), "automoved");
+    const PopupState *other = flow.popup("automoved/other", "OtherView");
+    flow.upper->addPopupState(flow.fuel);
+    flow.show();
+    flow.request("automoved/other");
+    Q_EMIT flow.target.popupStatusChanged("FuelView", true);
+
+    QVERIFY(fire(flow.timer()));
+    settle();
+
+    QVERIFY(!flow.fuel->isActive());
+    QVERIFY(other->isActive());
+    QCOMPARE(flow.upper->activePopupState(), flow.upper->noPopupState());
 }
 
 void tst_PopupStateAutoDismiss::switchingOffAndOnReusesTimerAndTransition()

@@ -138,6 +138,9 @@ void PopupState::setRootState(PopupRootState *root)
         }
     }
     m_root = root;
+    if (m_autoDismissTransition) {
+        m_autoDismissTransition->setTargetState(root ? root->noPopupState() : nullptr);
+    }
     addAutoDismissTransition();
 }
 
