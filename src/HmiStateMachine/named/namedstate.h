@@ -53,7 +53,7 @@ public:
 
     /**
      * Registers @p state under @p name. False when the name is empty or the state null, or when
-     * another state holds the name, which is a warning; the registry is unchanged then. Thread-safe.
+     * another state holds the name, with a warning; the registry is unchanged then. Thread-safe.
      */
     static bool hash(const QString &name, NamedState *state);
 
