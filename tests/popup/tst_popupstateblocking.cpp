@@ -40,6 +40,22 @@ private:
     Journal &m_journal;
 };
 
+/** Deletes the popups that it is handed, and tells how many it still holds then. */
+class DeletingTarget : public RecordingViewStateTarget
+{
+public:
+    using RecordingViewStateTarget::RecordingViewStateTarget;
+
+    void releaseBlockedPopups(const QMap<PopupState *, QTime> &blockedPopups) override
+    {
+        const auto popups = blockedPopups.keys();
+        qDeleteAll(popups);
+        heldAfterwards = blockedPopups.size();
+    }
+
+    int heldAfterwards = -1;
+};
+
 } // namespace
 
 class tst_PopupStateBlocking : public LibraryTest
@@ -62,6 +78,7 @@ private Q_SLOTS:
     void switchingStoringOffWithoutAViewLayerForgets();
     void aStoredPopupThatIsGivenUpIsForgotten();
     void aStoredPopupThatIsDeletedIsForgotten();
+    void whoIsHandedStoredPopupsMayDeleteThem();
 };
 
 void tst_PopupStateBlocking::aPopupThatIsBlockedOnEntryIsEnteredUnseen()
@@ -303,6 +320,21 @@ void tst_PopupStateBlocking::aStoredPopupThatIsDeletedIsForgotten()
     flow.request("blockdeleted/fuel");
     flow.request("FuelView_Dismiss");
     QCOMPARE(flow.take(), QStringList());
+}
+
+void tst_PopupStateBlocking::whoIsHandedStoredPopupsMayDeleteThem()
+{
+    PopupFlow flow(messages());
+    const StoringBlocked storing;
+    PopupState::popupBlocked(flow.popup("blockhanded/fuel", "FuelView"));
+    PopupState::popupBlocked(flow.popup("blockhanded/call", "CallView"));
+    Journal journal;
+    DeletingTarget target(journal);
+
+    PopupState::setStoreBlockedPopups(false);
+
+    QCOMPARE(target.heldAfterwards, 2);
+    QCOMPARE(PopupState::stateForTarget("blockhanded/fuel"), nullptr);
 }
 
 QTEST_GUILESS_MAIN(tst_PopupStateBlocking)
