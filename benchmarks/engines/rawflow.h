@@ -1,0 +1,43 @@
+#pragma once
+
+#include "rawpopup.h"
+#include "rawview.h"
+
+#include "flowshape.h"
+#include "keysource.h"
+#include "machineflow.h"
+
+namespace Raw {
+
+/** The flow of a shape on bare Qt: what the library is measured against. */
+class ShapeFlow : public MachineFlow
+{
+public:
+    explicit ShapeFlow(const FlowShape &shape);
+    ~ShapeFlow() override;
+
+protected:
+    void requestView(const QString &id, int data);
+    void requestBack();
+    void requestPopup(const QString &name, int data);
+    QString dismissIdentifier(const QString &popup) const;
+    void dismissPopup(const QString &identifier);
+
+    const QStringList &screens() const { return m_screenIds; }
+    QState *viewParent() const { return m_viewParent; }
+    KeySource &keys() { return m_keys; }
+
+private:
+    void showPopupsOnce(const QStringList &names);
+    void buildLayers(int count);
+    void buildViews(const FlowShape &shape);
+    void buildPopups(const FlowShape &shape);
+
+    Screens m_screens;
+    KeySource m_keys;
+    QStringList m_screenIds;
+    QState *m_viewParent;
+    PopupLayer *m_popups = nullptr;
+};
+
+} // namespace Raw

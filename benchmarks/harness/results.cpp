@@ -1,0 +1,125 @@
+#include "results.h"
+
+#include <QJsonArray>
+#include <QJsonDocument>
+
+#include <algorithm>
+
+namespace {
+
+const Engine engines[] = {Engine::Library, Engine::Raw, Engine::Scxml, Engine::Floor};
+
+QString key(const char *text)
+{
+    return QString::fromLatin1(text);
+}
+
+QJsonObject toJson(const SideResult &side)
+{
+    return {{key("instructions"), side.instructions},
+            {key("allocations"), side.allocations},
+            {key("heapBytes"), side.heapBytes},
+            {key("nanoseconds"), side.nanoseconds}};
+}
+
+QJsonObject toJson(const TimeRatio &ratio)
+{
+    return {{key("median"), ratio.median}, {key("low"), ratio.low}, {key("high"), ratio.high}};
+}
+
+SideResult sideFrom(const QJsonObject &json)
+{
+    return {json.value(key("instructions")).toDouble(), json.value(key("allocations")).toDouble(),
+            json.value(key("heapBytes")).toDouble(), json.value(key("nanoseconds")).toDouble()};
+}
+
+TimeRatio ratioFrom(const QJsonObject &json)
+{
+    return {json.value(key("median")).toDouble(), json.value(key("low")).toDouble(),
+            json.value(key("high")).toDouble()};
+}
+
+} // namespace
+
+QString engineName(Engine engine)
+{
+    switch (engine) {
+    case Engine::Library:
+        return key("library");
+    case Engine::Raw:
+        return key("raw");
+    case Engine::Scxml:
+        return key("scxml");
+    case Engine::Floor:
+        return key("floor");
+    }
+    return QString();
+}
+
+double WorkloadResult::instructionRatio(Engine engine) const
+{
+    const double other = sides.value(engine).instructions;
+    return other > 0 ? sides.value(Engine::Library).instructions / other : 0;
+}
+
+const WorkloadResult *find(const Results &results, const QString &id)
+{
+    const auto it = std::find_if(results.cbegin(), results.cend(),
+                                 [&id](const WorkloadResult &row) { return row.id == id; });
+    return it == results.cend() ? nullptr : &*it;
+}
+
+QJsonObject toJson(const Results &results)
+{
+    QJsonArray rows;
+    for (const WorkloadResult &result : results) {
+        QJsonObject sides;
+        QJsonObject ratios;
+        for (auto it = result.sides.cbegin(); it != result.sides.cend(); ++it) {
+            sides.insert(engineName(it.key()), toJson(it.value()));
+        }
+        for (auto it = result.timeRatios.cbegin(); it != result.timeRatios.cend(); ++it) {
+            ratios.insert(engineName(it.key()), toJson(it.value()));
+        }
+        rows.append(QJsonObject{{key("id"), result.id},
+                                {key("title"), result.title},
+                                {key("sides"), sides},
+                                {key("timeRatios"), ratios}});
+    }
+    return {{key("workloads"), rows}};
+}
+
+Results fromJson(const QByteArray &text, QString *error)
+{
+    QJsonParseError parseError;
+    const QJsonDocument document = QJsonDocument::fromJson(text, &parseError);
+    if (parseError.error != QJsonParseError::NoError) {
+        *error = QStringLiteral("%1 at byte %2").arg(parseError.errorString()).arg(
+            parseError.offset);
+        return Results();
+    }
+    Results results;
+    const QJsonArray rows = document.object().value(key("workloads")).toArray();
+    for (const QJsonValue &value : rows) {
+        const QJsonObject row = value.toObject();
+        WorkloadResult result;
+        result.id = row.value(key("id")).toString();
+        result.title = row.value(key("title")).toString();
+        const QJsonObject sides = row.value(key("sides")).toObject();
+        const QJsonObject ratios = row.value(key("timeRatios")).toObject();
+        for (Engine engine : engines) {
+            if (sides.contains(engineName(engine))) {
+                result.sides.insert(engine, sideFrom(sides.value(engineName(engine)).toObject()));
+            }
+            if (ratios.contains(engineName(engine))) {
+                result.timeRatios.insert(engine,
+                                         ratioFrom(ratios.value(engineName(engine)).toObject()));
+            }
+        }
+        results.append(result);
+    }
+    if (results.isEmpty()) {
+        *error = QStringLiteral("no workloads in it");
+    }
+    return results;
+}

@@ -1,0 +1,11 @@
+#include "keypress.h"
+#include "lifecycle.h"
+#include "lookups.h"
+#include "popuprounds.h"
+#include "viewswitch.h"
+
+QVector<Workload> allWorkloads()
+{
+    return viewSwitchWorkloads() + popupRoundWorkloads() + keyPressWorkloads()
+        + lifecycleWorkloads() + lookupWorkloads();
+}

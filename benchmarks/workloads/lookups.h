@@ -1,0 +1,6 @@
+#pragma once
+
+#include "workload.h"
+
+/** Interruption rules and names, looked up in large tables. */
+QVector<Workload> lookupWorkloads();
