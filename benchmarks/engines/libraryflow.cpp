@@ -1,5 +1,7 @@
 #include "libraryflow.h"
 
+#include "viewsetup.h"
+
 #include <HmiStateMachine/hmi/hmiviewstate.h>
 #include <HmiStateMachine/named/hmibackevent.h>
 #include <HmiStateMachine/named/hmiviewevent.h>
@@ -87,11 +89,12 @@ void ShapeFlow::buildViews(const FlowShape &shape)
     const QStringList names = shape.viewNames();
     for (int i = 0; i < names.size(); ++i) {
         auto *view = new HmiViewState(m_screenIds.at(i), names.at(i), m_viewParent);
+        addInstanceData(view);
         if (shape.back) {
             view->setHandlesBackEvent(true);
         }
         for (int key = 0; key < shape.keys; ++key) {
-            new KeySignalTransition(&m_keys, SIGNAL(keyChanged(int,int)), key, keyPressed, view);
+            new KeySignalTransition(&m_keys, SIGNAL(keyChanged(int, int)), key, keyPressed, view);
         }
         if (i == 0 && m_innermost) {
             m_innermost->setInitialHmiState(view);

@@ -10,7 +10,9 @@ class ViewLayer;
 class PlainView
 {
 public:
-    explicit PlainView(const QString &screen) : m_screen(screen) { }
+    explicit PlainView(const QString &screen);
+
+    void addInstanceData(const QString &key, const QVariant &value);
 
     void enter(ViewLayer &layer, const QVariant &data);
     void leave(ViewLayer &layer);

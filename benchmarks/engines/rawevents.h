@@ -41,8 +41,7 @@ class PopupEvent : public QEvent
 {
 public:
     PopupEvent(const QString &wantedPopup, bool returns, const QVariant &popupData)
-        : QEvent(PopupEventType), target(wantedPopup), reactivation(returns),
-          data(popupData)
+        : QEvent(PopupEventType), target(wantedPopup), reactivation(returns), data(popupData)
     {
     }
 

@@ -3,6 +3,8 @@
 #include "rawevents.h"
 #include "rawkey.h"
 
+#include "viewsetup.h"
+
 namespace Raw {
 
 namespace {
@@ -88,11 +90,12 @@ void ShapeFlow::buildViews(const FlowShape &shape)
     const QStringList names = shape.viewNames();
     for (int i = 0; i < names.size(); ++i) {
         auto *view = new View(m_screens, names.at(i), m_screenIds.at(i), m_viewParent);
+        addInstanceData(view);
         if (shape.back) {
             view->handleBack();
         }
         for (int key = 0; key < shape.keys; ++key) {
-            new KeyTransition(&m_keys, SIGNAL(keyChanged(int,int)), key, keyPressed, view);
+            new KeyTransition(&m_keys, SIGNAL(keyChanged(int, int)), key, keyPressed, view);
         }
         if (i == 0 && m_viewParent != &machine()) {
             m_viewParent->setInitialState(view);

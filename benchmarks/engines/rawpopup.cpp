@@ -68,8 +68,7 @@ void PopupLayer::followView(const QString &newView, const QString &oldView)
     Q_UNUSED(oldView)
 }
 
-PopupTransition::PopupTransition(PopupLayer *source)
-    : QAbstractTransition(source), m_popups(source)
+PopupTransition::PopupTransition(PopupLayer *source) : QAbstractTransition(source), m_popups(source)
 {
     // Not to leave and enter the layer itself with every popup.
     setTransitionType(InternalTransition);

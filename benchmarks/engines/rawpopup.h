@@ -3,8 +3,8 @@
 #include <QAbstractTransition>
 #include <QHash>
 #include <QMap>
-#include <QStringList>
 #include <QState>
+#include <QStringList>
 #include <QVariant>
 
 namespace HmiStateMachine {

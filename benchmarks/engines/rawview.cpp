@@ -76,6 +76,11 @@ void View::handleBack()
     m_back = new BackTransition(this);
 }
 
+void View::addInstanceData(const QString &key, const QVariant &value)
+{
+    m_instanceData.insert(key, value);
+}
+
 void View::onEntry(QEvent *event)
 {
     m_screens.layer.resetScreenPopupBehavior();
@@ -111,8 +116,8 @@ void View::findBackTarget(const QEvent *event, bool backEntry)
 {
     if (backEntry) {
         const auto *back = static_cast<const BackEvent *>(event);
-        m_back->setTargetState(
-            m_backStack.isEmpty() ? nullptr : m_screens.byName.value(m_backStack.pop()));
+        m_back->setTargetState(m_backStack.isEmpty() ? nullptr
+                                                     : m_screens.byName.value(m_backStack.pop()));
         m_screens.layer.postFollowOnBackEvent(back->depth, back->targetId, m_screen);
     } else if (!m_screens.lastKnown.isEmpty() && m_screens.lastKnown != m_name) {
         m_back->setTargetState(m_screens.byName.value(m_screens.lastKnown));

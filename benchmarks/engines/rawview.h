@@ -70,7 +70,7 @@ public:
     /** Lets a back press lead to where the view was entered from. */
     void handleBack();
 
-    const QString &screen() const { return m_screen; }
+    void addInstanceData(const QString &key, const QVariant &value);
 
 protected:
     void onEntry(QEvent *event) override;

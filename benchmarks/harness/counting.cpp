@@ -73,9 +73,9 @@ void countOnce(const Workload &workload, const Workload::Side &side, int layout)
     CALLGRIND_START_INSTRUMENTATION;
     flow->run(workload.counted);
     CALLGRIND_STOP_INSTRUMENTATION;
-    const QString label = QStringList{workload.id, engineName(side.engine),
-                                      QString::number(workload.counted)}
-                              .join(separator);
+    const QString label =
+        QStringList{workload.id, engineName(side.engine), QString::number(workload.counted)}.join(
+            separator);
     CALLGRIND_DUMP_STATS_AT(label.toLatin1().constData());
     flow->after();
 }
@@ -94,8 +94,7 @@ bool runCallgrind(const QStringList &arguments, QString *error)
     constexpr int noLimit = -1;
     valgrind.waitForFinished(noLimit);
     if (valgrind.exitStatus() != QProcess::NormalExit || valgrind.exitCode() != 0) {
-        *error = QStringLiteral("valgrind failed:\n")
-            + QString::fromLocal8Bit(valgrind.readAll());
+        *error = QStringLiteral("valgrind failed:\n") + QString::fromLocal8Bit(valgrind.readAll());
         return false;
     }
     return true;
@@ -121,11 +120,10 @@ bool countInstructions(const QStringList &ids, const Effort &effort, Results *re
                        QString *error)
 {
     const QTemporaryDir dir;
-    QStringList arguments{QStringLiteral("--tool=callgrind"),
-                          QStringLiteral("--instr-atstart=no"),
-                          QStringLiteral("--callgrind-out-file=") + dir.filePath(QStringLiteral("out")),
-                          QCoreApplication::applicationFilePath(),
-                          QStringLiteral("--run-for-counting")};
+    QStringList arguments{
+        QStringLiteral("--tool=callgrind"), QStringLiteral("--instr-atstart=no"),
+        QStringLiteral("--callgrind-out-file=") + dir.filePath(QStringLiteral("out")),
+        QCoreApplication::applicationFilePath(), QStringLiteral("--run-for-counting")};
     if (!effort.layouts) {
         arguments.append(QStringLiteral("--one-layout"));
     }

@@ -94,8 +94,8 @@ Results fromJson(const QByteArray &text, QString *error)
     QJsonParseError parseError;
     const QJsonDocument document = QJsonDocument::fromJson(text, &parseError);
     if (parseError.error != QJsonParseError::NoError) {
-        *error = QStringLiteral("%1 at byte %2").arg(parseError.errorString()).arg(
-            parseError.offset);
+        *error =
+            QStringLiteral("%1 at byte %2").arg(parseError.errorString()).arg(parseError.offset);
         return Results();
     }
     Results results;

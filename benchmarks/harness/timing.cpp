@@ -82,9 +82,9 @@ bool agree(const std::vector<Contestant> &contestants, const QString &id, QStrin
 {
     for (const Contestant &contestant : contestants) {
         if (contestant.flow->checksum() != contestants.front().flow->checksum()) {
-            *error = QStringLiteral("%1: %2 and %3 have not shown the same")
-                         .arg(id, engineName(contestants.front().engine),
-                              engineName(contestant.engine));
+            *error =
+                QStringLiteral("%1: %2 and %3 have not shown the same")
+                    .arg(id, engineName(contestants.front().engine), engineName(contestant.engine));
             return false;
         }
     }
@@ -114,10 +114,14 @@ void keepAllocations(std::vector<Contestant> &contestants, const Workload &workl
                      WorkloadResult *result)
 {
     for (Contestant &contestant : contestants) {
-        const Allocations allocations = countAllocations(*contestant.flow, workload.counted);
+        const Allocations total = countAllocations(*contestant.flow, workload.counted);
+        const double allocations = static_cast<double>(total.count) / workload.counted;
+        const bool first = !result->sides.contains(contestant.engine);
         SideResult &side = result->sides[contestant.engine];
-        side.allocations = static_cast<double>(allocations.count) / workload.counted;
-        side.heapBytes = static_cast<double>(allocations.bytes) / workload.counted;
+        if (first || allocations < side.allocations) {
+            side.allocations = allocations;
+            side.heapBytes = static_cast<double>(total.bytes) / workload.counted;
+        }
     }
 }
 
@@ -130,8 +134,7 @@ void warmUp(Flow &flow, const Workload &workload)
     flow.after();
 }
 
-bool measure(const Workload &workload, const Effort &effort, WorkloadResult *result,
-             QString *error)
+bool measure(const Workload &workload, const Effort &effort, WorkloadResult *result, QString *error)
 {
     result->id = workload.id;
     result->title = workload.title;
@@ -144,9 +147,7 @@ bool measure(const Workload &workload, const Effort &effort, WorkloadResult *res
             return false;
         }
         keepTimes(all, &times);
-        if (layout == 0) {
-            keepAllocations(all, workload, result);
-        }
+        keepAllocations(all, workload, result);
     }
     for (auto it = times.cbegin(); it != times.cend(); ++it) {
         result->sides[it.key()].nanoseconds = quantile(it.value(), 0.5);

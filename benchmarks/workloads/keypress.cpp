@@ -24,7 +24,8 @@ void guard(Raw::KeyTransition *transition)
                      [transition] { transition->setAllowed(true); });
 }
 
-/** One operation is one key, each time another one, that leads from one of two views to the other. */
+/** One operation is one key, each time another one, that leads from one of two views to the other.
+ */
 template <typename Base, typename Transition> class KeyPress : public Base
 {
 public:

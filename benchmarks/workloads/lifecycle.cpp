@@ -3,10 +3,13 @@
 #include "machineflow.h"
 #include "rawview.h"
 #include "sides.h"
+#include "viewsetup.h"
 
 #include <HmiStateMachine/hmi/hmiviewstate.h>
 
 namespace {
+
+// Every view is one as flows have them: with instance data, and with a way back.
 
 enum class Phase { Build, Start, Destroy };
 
@@ -27,7 +30,10 @@ protected:
     }
     QState *buildView(const QString &name)
     {
-        return new Raw::View(m_screens, name, name, m_group);
+        auto *view = new Raw::View(m_screens, name, name, m_group);
+        addInstanceData(view);
+        view->handleBack();
+        return view;
     }
 
     QState *m_group = nullptr;
@@ -40,9 +46,8 @@ private:
 class LibraryViews : public LibraryFlow
 {
 public:
-    explicit LibraryViews(
-        HmiStateMachine::HmiState::PopupBehavior behavior =
-            HmiStateMachine::HmiState::DefaultPopupBehavior)
+    explicit LibraryViews(HmiStateMachine::HmiState::PopupBehavior behavior =
+                              HmiStateMachine::HmiState::DefaultPopupBehavior)
         : m_behavior(behavior)
     {
     }
@@ -57,7 +62,10 @@ protected:
     }
     QState *buildView(const QString &name)
     {
-        return new HmiStateMachine::HmiViewState(name, m_group);
+        auto *view = new HmiStateMachine::HmiViewState(name, m_group);
+        addInstanceData(view);
+        view->setHandlesBackEvent(true);
+        return view;
     }
 
     QState *m_group = nullptr;

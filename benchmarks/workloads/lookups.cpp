@@ -51,12 +51,12 @@ Wildcard ruleWildcard(int rule)
 
 QString entryId(int entry, Wildcard wildcard)
 {
-    return id(QStringLiteral("Module"), QStringLiteral("Popup"), entry, wildcard);
+    return id(QStringLiteral("app"), QStringLiteral("popup"), entry, wildcard);
 }
 
 QString targetId(int rule, Wildcard wildcard)
 {
-    return id(QStringLiteral("Source"), QStringLiteral("Message"), rule, wildcard);
+    return id(QStringLiteral("phone"), QStringLiteral("call"), rule, wildcard);
 }
 
 struct Query
@@ -102,8 +102,7 @@ QVector<Query> mixedQueries(int count)
             result.append(query(wildcardEntry, rule + 1 + i / 6 % 2));
             break;
         default:
-            result.append({QStringLiteral("Elsewhere/Unknown%1").arg(i),
-                           targetId(rule, Wildcard::None)});
+            result.append({QStringLiteral("other/popup%1").arg(i), targetId(rule, Wildcard::None)});
         }
     }
     return result;
@@ -220,7 +219,12 @@ constexpr int countedLookups = 3000;
 template <typename Work>
 Workload lookup(const QString &id, const QString &title, const QVector<Query> &queries)
 {
-    return {id,           title, timedLookups, countedLookups, countedLookups, 1,
+    return {id,
+            title,
+            timedLookups,
+            countedLookups,
+            countedLookups,
+            1,
             {side<Work>(Engine::Library, queries)}};
 }
 

@@ -202,10 +202,10 @@ Workload forwardAndBack()
 
 QVector<Workload> viewSwitchWorkloads()
 {
-    return {flatSwitch(10),          flatSwitch(40),          flatSwitch(100),
-            flatSwitch(1000),        flatSwitch(10000),       layeredSwitch(1),
-            switchByScreen(10),      switchByScreen(10000),   switchBesidePopups(8),
-            switchBesidePopups(64),  switchBesidePopups(512), switchWithKeys(20),
-            switchWithKeys(100),     ignoredEvent(),          layeredSwitch(2),
-            layeredSwitch(3),        layeredSwitch(4),        forwardAndBack()};
+    return {flatSwitch(10),         flatSwitch(40),          flatSwitch(100),
+            flatSwitch(1000),       flatSwitch(10000),       layeredSwitch(1),
+            switchByScreen(10),     switchByScreen(10000),   switchBesidePopups(8),
+            switchBesidePopups(64), switchBesidePopups(512), switchWithKeys(20),
+            switchWithKeys(100),    ignoredEvent(),          layeredSwitch(2),
+            layeredSwitch(3),       layeredSwitch(4),        forwardAndBack()};
 }
