@@ -5,8 +5,6 @@
 
 #include <QState>
 
-#include <algorithm>
-
 namespace HmiStateMachine {
 
 namespace {
@@ -43,11 +41,12 @@ bool ParallelSiblingTransitionGroup::addTransition(NamedTargetTransitionBase *tr
         logPriorityChange(transition, registered.value(), priority);
         return false;
     }
-    if (isPriorityTaken(priority)) {
+    if (m_takenPriorities.contains(priority)) {
         return false;
     }
     if (QAbstractState *source = transition->getSourceState()) {
         m_priorities.insert(transition, priority);
+        m_takenPriorities.insert(priority);
         trackSource(transition, source);
     }
     // Required: without a source state too, so that the transition knows of the group all the same.
@@ -90,13 +89,6 @@ void ParallelSiblingTransitionGroup::siblingDeactivated(NamedTargetTransitionBas
     m_activeSiblings.removeAll(transition);
 }
 
-bool ParallelSiblingTransitionGroup::isPriorityTaken(int priority) const
-{
-    return m_retiredPriorities.contains(priority)
-        || std::find(m_priorities.constBegin(), m_priorities.constEnd(), priority)
-        != m_priorities.constEnd();
-}
-
 void ParallelSiblingTransitionGroup::trackSource(NamedTargetTransitionBase *transition,
                                                  QAbstractState *source)
 {
@@ -118,11 +110,7 @@ void ParallelSiblingTransitionGroup::retire(NamedTargetTransitionBase *transitio
     }
     m_connections.remove(transition);
     m_activeSiblings.removeAll(transition);
-    const auto registered = m_priorities.constFind(transition);
-    if (registered != m_priorities.constEnd()) {
-        m_retiredPriorities.insert(registered.value());
-        m_priorities.remove(transition);
-    }
+    m_priorities.remove(transition); // its priority stays taken
 }
 
 SiblingFunctorBase::SiblingFunctorBase(ParallelSiblingTransitionGroup *group,

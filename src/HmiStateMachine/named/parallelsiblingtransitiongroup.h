@@ -54,14 +54,13 @@ private:
 
     friend class NamedTargetTransitionBase;
 
-    bool isPriorityTaken(int priority) const;
     void trackSource(NamedTargetTransitionBase *transition, QAbstractState *source);
     void retire(NamedTargetTransitionBase *transition);
 
     QHash<NamedTargetTransitionBase *, int> m_priorities;
     QList<NamedTargetTransitionBase *> m_activeSiblings;
     QMultiHash<NamedTargetTransitionBase *, QMetaObject::Connection> m_connections;
-    QSet<int> m_retiredPriorities;
+    QSet<int> m_takenPriorities; // also those of transitions that are gone
 };
 
 /** Ties a member of a group to the entries and exits of its source state. */
