@@ -55,11 +55,8 @@ bool HmiSignalTransition::makeParallelExclusive(int priority)
 
 bool HmiSignalTransition::eventTest(QEvent *event)
 {
-    if (m_blocked || !arbitratedEventTest(event)) {
-        return false;
-    }
-    m_triggerArguments = static_cast<QStateMachine::SignalEvent *>(event)->arguments();
-    return true;
+    // Short: Qt asks every transition of an active state three times for every event.
+    return !m_blocked && internalEventTest(event) && takeSignal(event);
 }
 
 void HmiSignalTransition::onTransition(QEvent *event)
@@ -83,14 +80,18 @@ QAbstractState *HmiSignalTransition::getTarget() const
     return targetState();
 }
 
-bool HmiSignalTransition::internalEventTest(QEvent *event)
-{
-    return QSignalTransition::eventTest(event);
-}
-
 void HmiSignalTransition::sourceStateChange(QState *state)
 {
     Q_UNUSED(state)
+}
+
+bool HmiSignalTransition::takeSignal(QEvent *event)
+{
+    if (!arbitrate(event)) {
+        return false;
+    }
+    m_triggerArguments = static_cast<QStateMachine::SignalEvent *>(event)->arguments();
+    return true;
 }
 
 // Qt keeps the sender as a bare pointer and disconnects from it when the machine stops or the

@@ -49,7 +49,9 @@ public:
     QState *getSourceState() const override;
     void changeTarget(QState *target) override;
     QAbstractState *getTarget() const override;
-    bool internalEventTest(QEvent *event) override;
+
+    // In place, because every transition of an active state is asked three times for every event.
+    bool internalEventTest(QEvent *event) override { return QSignalTransition::eventTest(event); }
 
     /** HmiState::addHmiTransition() has made @p state the source; does nothing here. */
     virtual void sourceStateChange(QState *state);
@@ -63,6 +65,7 @@ private:
 
     friend class TriggerFunctor;
 
+    bool takeSignal(QEvent *event);
     void followSender();
     void forgetSender();
 

@@ -33,7 +33,7 @@ bool GuardedTransition::makeParallelExclusive(int priority)
 
 bool GuardedTransition::eventTest(QEvent *event)
 {
-    return arbitratedEventTest(event);
+    return internalEventTest(event) && arbitrate(event);
 }
 
 void GuardedTransition::onTransition(QEvent *event)

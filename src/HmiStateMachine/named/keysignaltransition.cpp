@@ -85,9 +85,11 @@ bool KeySignalTransition::makeParallelExclusive(int priority)
 
 bool KeySignalTransition::internalEventTest(QEvent *event)
 {
-    if (!HmiSignalTransition::internalEventTest(event)) {
-        return false;
-    }
+    return HmiSignalTransition::internalEventTest(event) && keyTest(event);
+}
+
+bool KeySignalTransition::keyTest(QEvent *event)
+{
     const QVariantList arguments = static_cast<QStateMachine::SignalEvent *>(event)->arguments();
     int key = 0;
     int status = 0;

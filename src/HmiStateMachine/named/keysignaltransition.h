@@ -60,6 +60,8 @@ private Q_SLOTS:
 private:
     Q_DISABLE_COPY(KeySignalTransition)
 
+    bool keyTest(QEvent *event);
+
     QString m_transitionKey;
     QList<int> m_keys;
     int m_status;

@@ -91,9 +91,9 @@ bool NamedTargetTransitionBase::activeSiblingTest(QEvent *event)
     return false;
 }
 
-bool NamedTargetTransitionBase::arbitratedEventTest(QEvent *event)
+bool NamedTargetTransitionBase::arbitrate(QEvent *event)
 {
-    if (!internalEventTest(event) || activeSiblingTest(event) || wouldFireForEver(event)) {
+    if (activeSiblingTest(event) || wouldFireForEver(event)) {
         return false;
     }
     aboutToBeTriggered();

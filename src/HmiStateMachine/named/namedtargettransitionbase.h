@@ -73,8 +73,8 @@ public:
     bool activeSiblingTest(QEvent *event);
 
 protected:
-    /** The common event test: own test, then siblings, then listed as about to fire. */
-    bool arbitratedEventTest(QEvent *event);
+    /** What follows when the own test has passed: siblings, then listed as about to fire. */
+    bool arbitrate(QEvent *event);
 
     /** The common end of a firing: off the list, then the voice request is passed on. */
     void finishTransition();
@@ -88,8 +88,8 @@ private:
 
     QVector<QPointer<ParallelSiblingTransitionGroup>> m_siblingGroups;
     bool m_isVREvent = false;
+    bool m_warnedOfMissingTarget = false; // here, where it takes no room of its own
     QVariant m_vrEventData;
-    bool m_warnedOfMissingTarget = false;
 };
 
 } // namespace HmiStateMachine

@@ -56,7 +56,7 @@ bool SimpleEventTransition::makeParallelExclusive(int priority)
 
 bool SimpleEventTransition::eventTest(QEvent *event)
 {
-    return arbitratedEventTest(event);
+    return internalEventTest(event) && arbitrate(event);
 }
 
 void SimpleEventTransition::onTransition(QEvent *event)
