@@ -15,9 +15,10 @@ constexpr char screenEntryMarker[] = "P12.R041.02 - Screen Entry: Start Marker";
 
 HmiState::HmiState(const QString &name, QState *parent) : NamedState(name, nullptr)
 {
-    setParent(exclusiveLayerOf(parent));
+    QState *layer = exclusiveLayerOf(parent);
+    setParent(layer);
     // From the layer, not the layered state: an explicit setting cuts the connection to the parent.
-    inheritPopupBehavior(parentState());
+    inheritPopupBehavior(layer);
 }
 
 HmiState::HmiState(QState *parent) : NamedState(parent)
@@ -112,8 +113,9 @@ void HmiState::inheritPopupBehavior(QState *parent)
     if (!hmiParent) {
         return;
     }
-    // In this order: an explicit setting cuts the connection that follows it here.
-    setPopupBehavior(hmiParent->popupBehavior());
+    // Not as an explicit setting, which would look through all connections of the parent for the
+    // one to this state, that is only made here.
+    syncPopupBehavior(hmiParent->popupBehavior());
     connect(hmiParent, &HmiState::popupBehaviorChanged, this, &HmiState::syncPopupBehavior);
 }
 
