@@ -1,6 +1,7 @@
 #include <HmiStateMachine/popup/popupinterruptionstore.h>
 
 #include <HmiStateMachine/internal/logging.h>
+#include <HmiStateMachine/internal/rulename.h>
 #include <HmiStateMachine/named/viewstatetarget.h>
 
 #include <QCoreApplication>
@@ -10,53 +11,12 @@
 #include <QJsonDocument>
 #include <QJsonObject>
 #include <QPointer>
-#include <QStringView>
 
 namespace HmiStateMachine {
 
 namespace {
 
 constexpr auto invalidBehavior = static_cast<PopupState::InterruptionBehavior>(-1);
-constexpr QChar separator = QLatin1Char('/');
-constexpr QChar any = QLatin1Char('*');
-
-/** The two parts of a name that wildcards leave open in turn. */
-struct NameParts
-{
-    bool hasWildCards;
-    QStringView module;
-    QStringView popup;
-};
-
-// As if split at each slash: only the first two parts count.
-NameParts split(const QString &name)
-{
-    const int first = name.indexOf(separator);
-    if (first < 0) {
-        return {false, QStringView(), QStringView()};
-    }
-    const int second = name.indexOf(separator, first + 1);
-    const int end = second < 0 ? name.size() : second;
-    const QStringView whole(name);
-    return {true, whole.left(first), whole.mid(first + 1, end - first - 1)};
-}
-
-const QString *findWildCard(const QMultiHash<uint, QString> &index, QStringView part,
-                            bool partComesFirst)
-{
-    if (index.isEmpty()) {
-        return nullptr;
-    }
-    const uint hash = qHash(part);
-    for (auto it = index.constFind(hash); it != index.constEnd() && it.key() == hash; ++it) {
-        const QStringView key(it.value());
-        if (partComesFirst ? key.chopped(2) == part : key.mid(2) == part) {
-            return &it.value();
-        }
-    }
-    return nullptr;
-}
-
 QString readString(const QJsonObject &object, const char *key)
 {
     return object.value(QLatin1String(key)).toString();
@@ -91,14 +51,14 @@ PopupState::InterruptionBehavior behaviorFromString(const QString &text)
 
 QString extractPopupWildCard(const QString &name)
 {
-    const NameParts parts = split(name);
-    return parts.hasWildCards ? QStringLiteral("*/") + parts.popup.toString() : QString();
+    RuleName parts(name);
+    return parts.isDivided() ? QStringLiteral("*/") + parts.popup().toString() : QString();
 }
 
 QString extractModuleWildCard(const QString &name)
 {
-    const NameParts parts = split(name);
-    return parts.hasWildCards ? parts.module.toString() + QStringLiteral("/*") : QString();
+    RuleName parts(name);
+    return parts.isDivided() ? parts.module().toString() + QStringLiteral("/*") : QString();
 }
 
 PopupInterruptionStore::PopupInterruptionStore(QObject *parent) : QObject(parent)
@@ -141,26 +101,24 @@ void PopupInterruptionStore::loadInterruptionBehaviors(const QString &fileName)
 void PopupInterruptionStore::insertInterruptionBehavior(PopupState::InterruptionBehavior behavior,
                                                         const QString &popup, const QString &target)
 {
-    m_interruptions[popup].insert(target, behavior);
-    indexWildCard(popup);
-    indexWildCard(target);
+    m_interruptions[RuleName(popup)].insert(RuleName(target), behavior);
 }
 
 PopupState::InterruptionBehavior PopupInterruptionStore::getInterruptionBehavior(
     const QString &popup, const QString &target) const
 {
-    auto result = PopupState::Allow;
-    const auto byDefault = find(m_defaults, popup);
-    if (byDefault != m_defaults.constEnd()) {
-        result = byDefault.value();
-    }
+    RuleName front(popup);
     // One table alone: an exact entry hides those with a wildcard, also where it has no rule.
-    const auto table = find(m_interruptions, popup);
-    if (table == m_interruptions.constEnd()) {
-        return result;
+    const auto table = findRule(m_interruptions, front);
+    if (table != m_interruptions.constEnd()) {
+        RuleName requested(target);
+        const auto rule = findRule(table.value(), requested);
+        if (rule != table.value().constEnd()) {
+            return rule.value();
+        }
     }
-    const auto rule = find(table.value(), target);
-    return rule == table.value().constEnd() ? result : rule.value();
+    const auto byDefault = findRule(m_defaults, front);
+    return byDefault == m_defaults.constEnd() ? PopupState::Allow : byDefault.value();
 }
 
 PopupState::InterruptionBehavior PopupInterruptionStore::getInterruptionBehavior(
@@ -171,7 +129,11 @@ PopupState::InterruptionBehavior PopupInterruptionStore::getInterruptionBehavior
 
 bool PopupInterruptionStore::isBlockedByDomain(const QString &popup, int domain) const
 {
-    const auto list = find(m_domainBlacklist, popup);
+    if (m_domainBlacklist.isEmpty()) {
+        return false;
+    }
+    RuleName name(popup);
+    const auto list = findRule(m_domainBlacklist, name);
     return list != m_domainBlacklist.constEnd() && list.value().contains(domain);
 }
 
@@ -193,7 +155,11 @@ bool PopupInterruptionStore::isBlockedByDomain(const PopupState *popup) const
 
 bool PopupInterruptionStore::isBlockedByView(const QString &popup, const QString &view) const
 {
-    const auto list = find(m_viewBlacklist, popup);
+    if (m_viewBlacklist.isEmpty()) {
+        return false;
+    }
+    RuleName name(popup);
+    const auto list = findRule(m_viewBlacklist, name);
     return list != m_viewBlacklist.constEnd() && list.value().contains(view);
 }
 
@@ -224,8 +190,7 @@ void PopupInterruptionStore::loadEntry(const QJsonObject &entry, int index)
     loadRules(popup, entry.value(QLatin1String("interruptions")).toArray(), index);
     if (entry.contains(QLatin1String("default"))) {
         // Stored as it is: an invalid text makes it -1, without a word.
-        m_defaults.insert(popup, behaviorFromString(readString(entry, "default")));
-        indexWildCard(popup);
+        m_defaults.insert(RuleName(popup), behaviorFromString(readString(entry, "default")));
     }
     loadBlacklists(popup, entry);
 }
@@ -263,59 +228,11 @@ void PopupInterruptionStore::loadBlacklists(const QString &popup, const QJsonObj
     const QList<QString> views = readStrings(entry, "viewBlacklist");
     // An empty list stores nothing, so that a wildcard's list applies.
     if (!domains.isEmpty()) {
-        m_domainBlacklist.insert(popup, domains);
-        indexWildCard(popup);
+        m_domainBlacklist.insert(RuleName(popup), domains);
     }
     if (!views.isEmpty()) {
-        m_viewBlacklist.insert(popup, views);
-        indexWildCard(popup);
+        m_viewBlacklist.insert(RuleName(popup), views);
     }
-}
-
-void PopupInterruptionStore::indexWildCard(const QString &key)
-{
-    const QStringView whole(key);
-    if (whole.size() < 2) {
-        return;
-    }
-    const auto insertOnce = [&key](QMultiHash<uint, QString> &index, QStringView part) {
-        const uint hash = qHash(part);
-        if (!index.contains(hash, key)) {
-            index.insert(hash, key);
-        }
-    };
-    if (whole.at(0) == any && whole.at(1) == separator) {
-        insertOnce(m_popupWildCards, whole.mid(2));
-    }
-    if (whole.at(whole.size() - 1) == any && whole.at(whole.size() - 2) == separator) {
-        insertOnce(m_moduleWildCards, whole.chopped(2));
-    }
-}
-
-// The exact name comes first, then the same popup of any module, then any popup of the module.
-template <typename Table>
-typename Table::const_iterator PopupInterruptionStore::find(const Table &table,
-                                                            const QString &name) const
-{
-    if (table.isEmpty()) {
-        return table.constEnd();
-    }
-    const auto exact = table.constFind(name);
-    if (exact != table.constEnd()) {
-        return exact;
-    }
-    const NameParts parts = split(name);
-    if (!parts.hasWildCards) {
-        return table.constEnd();
-    }
-    if (const QString *key = findWildCard(m_popupWildCards, parts.popup, false)) {
-        const auto popupWildCard = table.constFind(*key);
-        if (popupWildCard != table.constEnd()) {
-            return popupWildCard;
-        }
-    }
-    const QString *key = findWildCard(m_moduleWildCards, parts.module, true);
-    return key ? table.constFind(*key) : table.constEnd();
 }
 
 } // namespace HmiStateMachine

@@ -13,6 +13,8 @@ class QJsonObject;
 
 namespace HmiStateMachine {
 
+class RuleName;
+
 /**
  * The behaviour that @p text names, in any case: "Prohibit", "Allow", "AllowStack" or
  * "AllowNoReturn"; -1 for any other text.
@@ -81,23 +83,16 @@ public:
 private:
     Q_DISABLE_COPY(PopupInterruptionStore)
 
-    using Behaviors = QHash<QString, PopupState::InterruptionBehavior>;
+    using Behaviors = QHash<RuleName, PopupState::InterruptionBehavior>;
 
     void loadEntry(const QJsonObject &entry, int index);
     void loadRules(const QString &popup, const QJsonArray &rules, int entryIndex);
     void loadBlacklists(const QString &popup, const QJsonObject &entry);
-    void indexWildCard(const QString &key);
-    template <typename Table>
-    typename Table::const_iterator find(const Table &table, const QString &name) const;
 
-    QHash<QString, Behaviors> m_interruptions;
+    QHash<RuleName, Behaviors> m_interruptions;
     Behaviors m_defaults;
-    QHash<QString, QList<int>> m_domainBlacklist;
-    QHash<QString, QList<QString>> m_viewBlacklist;
-    // The wildcards among all names above, by the hash of the part that they fix: a name finds its
-    // wildcards without a string being made.
-    QMultiHash<uint, QString> m_popupWildCards;
-    QMultiHash<uint, QString> m_moduleWildCards;
+    QHash<RuleName, QList<int>> m_domainBlacklist;
+    QHash<RuleName, QList<QString>> m_viewBlacklist;
 };
 
 } // namespace HmiStateMachine
