@@ -1,6 +1,7 @@
 #include <HmiStateMachine/hmi/hmifallbackviewstate.h>
 
 #include <HmiStateMachine/hmi/hmifallbacktransition.h>
+#include <HmiStateMachine/internal/owntransition.h>
 #include <HmiStateMachine/named/hmifallbackevent.h>
 #include <HmiStateMachine/named/statemachine.h>
 
@@ -14,7 +15,8 @@ HmiFallbackViewState::HmiFallbackViewState(const QString &name, const QString &f
 
 HmiFallbackViewState::HmiFallbackViewState(const QString &targetView, const QString &name,
                                            const QString &fallbackState, QState *parent)
-    : HmiViewState(targetView, name, parent), m_fallbackTransition(new HmiFallbackTransition(this))
+    : HmiViewState(targetView, name, parent),
+      m_fallbackTransition(ownTransition<HmiFallbackTransition>(this))
 {
     m_fallbackTransition->setNamedTargetState(fallbackState);
 }

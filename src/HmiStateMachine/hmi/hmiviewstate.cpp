@@ -3,6 +3,8 @@
 #include <HmiStateMachine/hmi/hmibacktransition.h>
 #include <HmiStateMachine/hmi/hmiviewtransition.h>
 #include <HmiStateMachine/internal/logging.h>
+#include <HmiStateMachine/internal/owntransition.h>
+#include <HmiStateMachine/internal/targetindex.h>
 #include <HmiStateMachine/named/hmibackevent.h>
 #include <HmiStateMachine/named/hmifallbackevent.h>
 #include <HmiStateMachine/named/hmiviewevent.h>
@@ -59,7 +61,7 @@ HmiViewState::HmiViewState(const QString &name, QState *parent) : HmiViewState(n
 
 HmiViewState::HmiViewState(const QString &targetView, const QString &name, QState *parent)
     : HmiState(name, parent), m_targetView(targetView), m_backStackStateId(name),
-      m_indirectViewTransition(new HmiViewTransition(this))
+      m_indirectViewTransition(ownTransition<HmiViewTransition>(this))
 {
 }
 
@@ -117,14 +119,8 @@ HmiViewState *HmiViewState::stateForTarget(const QString &target)
     if (target.isEmpty()) {
         return nullptr;
     }
-    const auto states = namedStates();
-    for (NamedState *state : states) {
-        auto *view = qobject_cast<HmiViewState *>(state);
-        if (view && view->m_targetView == target) {
-            return view;
-        }
-    }
-    return nullptr;
+    static TargetIndex<HmiViewState> byTargetView(&HmiViewState::targetView);
+    return byTargetView.find(target);
 }
 
 void HmiViewState::setHandlesBackEvent(bool on)
@@ -137,7 +133,7 @@ void HmiViewState::setHandlesBackEvent(bool on)
         return;
     }
     if (on) {
-        m_backTransition = new HmiBackTransition(this);
+        m_backTransition = ownTransition<HmiBackTransition>(this);
     } else {
         removeBackTransition(m_backTransition);
     }
@@ -157,7 +153,7 @@ void HmiViewState::createDirectBackTransition(QAbstractState *target)
     }
     removeBackTransition(m_backTransition);
     if (target) {
-        m_directBackTransition = new HmiBackTransition(this);
+        m_directBackTransition = ownTransition<HmiBackTransition>(this);
         m_directBackTransition->setTargetState(target);
     }
     Q_EMIT directBackTransitionTargetChanged(target);
@@ -437,7 +433,7 @@ void HmiViewState::updateDummyBackTransition(const HmiViewState &left)
 {
     if (left.m_backTransition) {
         if (!m_dummyBackTransition) {
-            m_dummyBackTransition = new HmiBackTransition(this);
+            m_dummyBackTransition = ownTransition<HmiBackTransition>(this);
         }
         m_dummyBackTransition->setTargetState(left.m_backTransition->targetState());
         HMI_DEBUG_FROM(hmistatemachine(), "onEntry")
@@ -445,7 +441,7 @@ void HmiViewState::updateDummyBackTransition(const HmiViewState &left)
         removeBackTransition(m_dummyDirectBackTransition);
     } else if (left.m_directBackTransition) {
         if (!m_dummyDirectBackTransition) {
-            m_dummyDirectBackTransition = new HmiBackTransition(this);
+            m_dummyDirectBackTransition = ownTransition<HmiBackTransition>(this);
         }
         m_dummyDirectBackTransition->setTargetState(left.m_directBackTransition->targetState());
         HMI_DEBUG_FROM(hmistatemachine(), "onEntry")

@@ -5,12 +5,14 @@
 #include <HmiStateMachine/internal/metatypes.h>
 #include <HmiStateMachine/named/keysignaltransition.h>
 
+#include <QAtomicInt>
 #include <QChildEvent>
 #include <QHash>
 #include <QMutex>
-#include <QMutexLocker>
 #include <QPointer>
 #include <QVector>
+
+#include <mutex>
 
 namespace HmiStateMachine {
 
@@ -18,15 +20,20 @@ Q_CONSTRUCTOR_FUNCTION(registerMetaTypes)
 
 namespace {
 
+// Locks and unlocks in place when nobody else does, which QMutexLocker leaves to a call.
+using Lock = std::lock_guard<QBasicMutex>;
+
 struct Registry
 {
     QHash<QString, NamedState *> stateHash;
-    QMutex hashGuard;
+    QBasicMutex hashGuard;
+    QAtomicInt changes; // read without the lock
     bool s_loggingEnabled = false;
 };
 
-// Made with the first state, so that it outlives every state, also those of static storage.
-Registry &registry()
+// Made with the first state, so that it outlives every state, also those of static storage. In
+// place, as every view request asks for a name.
+Q_ALWAYS_INLINE Registry &registry()
 {
     static Registry instance;
     return instance;
@@ -40,6 +47,21 @@ void warnOfCollision(const QString &name, const QObject *state, const QObject *h
         << QStringLiteral("Name: \"") + name + QStringLiteral("\"\n") << "This state: " << state
         << "\n"
         << "Colliding state: " << holder;
+}
+
+// One walk up the bases in place of two casts: every child of every state comes through here.
+bool isRawSignalTransition(const QObject *object)
+{
+    for (const QMetaObject *base = object ? object->metaObject() : nullptr; base;
+         base = base->superClass()) {
+        if (base == &HmiSignalTransition::staticMetaObject) {
+            return false;
+        }
+        if (base == &QSignalTransition::staticMetaObject) {
+            return true;
+        }
+    }
+    return false;
 }
 
 // Guarded, so that a monitor that is deleted by another one is not called any more.
@@ -99,14 +121,14 @@ void NamedState::setNameNonHashing(const QString &name)
 NamedState *NamedState::stateForName(const QString &name)
 {
     Registry &r = registry();
-    QMutexLocker locker(&r.hashGuard);
+    const Lock lock(r.hashGuard);
     return r.stateHash.value(name, nullptr);
 }
 
 QList<NamedState *> NamedState::namedStates()
 {
     Registry &r = registry();
-    QMutexLocker locker(&r.hashGuard);
+    const Lock lock(r.hashGuard);
     return r.stateHash.values();
 }
 
@@ -116,13 +138,14 @@ bool NamedState::hash(const QString &name, NamedState *state)
         return false;
     }
     Registry &r = registry();
-    QMutexLocker locker(&r.hashGuard);
+    const Lock lock(r.hashGuard);
     NamedState *&entry = r.stateHash[name];
     if (entry) {
         warnOfCollision(name, state, entry);
         return false;
     }
     entry = state;
+    r.changes.ref();
     return true;
 }
 
@@ -132,8 +155,15 @@ void NamedState::removeFromHash(const QString &name)
         return;
     }
     Registry &r = registry();
-    QMutexLocker locker(&r.hashGuard);
-    r.stateHash.remove(name);
+    const Lock lock(r.hashGuard);
+    if (r.stateHash.remove(name) > 0) {
+        r.changes.ref();
+    }
+}
+
+int NamedState::registryChanges()
+{
+    return registry().changes.loadAcquire();
 }
 
 void NamedState::setLoggingEnabled(bool enabled)
@@ -167,7 +197,7 @@ HmiSignalTransition *NamedState::addTransition(const QObject *sender, const char
 
 void NamedState::transitionTypeTest(QObject *object)
 {
-    if (qobject_cast<QSignalTransition *>(object) && !qobject_cast<HmiSignalTransition *>(object)) {
+    if (isRawSignalTransition(object)) {
         QMessageLogger(__FILE__, __LINE__, __func__).fatal("Raw QSignalTransition usage detected!");
     }
 }
@@ -220,9 +250,10 @@ bool NamedState::event(QEvent *e)
 {
     if (e->type() == QEvent::ChildAdded) {
         QObject *child = static_cast<QChildEvent *>(e)->child();
-        transitionTypeTest(child);
         if (child->metaObject() == &QObject::staticMetaObject) {
             checkChildrenLater();
+        } else {
+            transitionTypeTest(child);
         }
     }
     return QState::event(e);

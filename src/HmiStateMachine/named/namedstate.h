@@ -9,6 +9,7 @@
 namespace HmiStateMachine {
 
 class HmiSignalTransition;
+template <typename State> class TargetIndex;
 
 /**
  * A state with a name that is unique in the process, under which transitions find it.
@@ -126,6 +127,9 @@ public:
 private:
     Q_DISABLE_COPY(NamedState)
 
+    template <typename State> friend class TargetIndex;
+
+    static int registryChanges();
     void checkChildrenLater();
     void checkChildren();
     void forgetMonitor(QObject *monitor);
