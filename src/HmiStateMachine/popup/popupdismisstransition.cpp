@@ -77,6 +77,11 @@ void PopupDismissTransition::trigger()
 
 bool PopupDismissTransition::eventTest(QEvent *event)
 {
+    // First of all, and without a call: the transitions of all popups that were shown before hang
+    // on their root, and Qt asks each of them three times for every event.
+    if (event->type() != PopupEvent::eventType()) {
+        return false;
+    }
     if (!m_popup || !isDismissEvent(event)) {
         return false;
     }

@@ -74,7 +74,8 @@ void PopupRootState::setActivePopupState(PopupState *popup)
     if (!popup) {
         return;
     }
-    popup->addTransition(m_popupTransition);
+    // As a child, which is all that addTransition() would do for a transition without a signal.
+    m_popupTransition->setParent(popup);
     if (popup == m_noPopupState) {
         requestReturn();
     } else {

@@ -3,6 +3,8 @@
 #include <HmiStateMachine/hmi/hmilayeredstate.h>
 #include <HmiStateMachine/hmi/hmisignaltransition.h>
 #include <HmiStateMachine/internal/logging.h>
+#include <HmiStateMachine/internal/slotconnection.h>
+#include <HmiStateMachine/internal/targetindex.h>
 #include <HmiStateMachine/named/guardedpropertychangetransition.h>
 #include <HmiStateMachine/named/popupevent.h>
 #include <HmiStateMachine/named/viewstatetarget.h>
@@ -37,6 +39,28 @@ PopupRecords &records()
 {
     static PopupRecords instance;
     return instance;
+}
+
+TargetIndex<PopupState> &popupsByViewId()
+{
+    static TargetIndex<PopupState> index(&PopupState::popupViewId);
+    return index;
+}
+
+const SlotConnection &domainConnection()
+{
+    static const SlotConnection connection(&ViewStateTarget::activeDomainChanged,
+                                           PopupState::staticMetaObject,
+                                           "activeDomainChanged(int,int)");
+    return connection;
+}
+
+const SlotConnection &viewConnection()
+{
+    static const SlotConnection connection(&ViewStateTarget::activeViewChanged,
+                                           PopupState::staticMetaObject,
+                                           "activeViewChanged(Identifier,Identifier)");
+    return connection;
 }
 
 PopupRootState *rootOf(HmiLayeredState *layer)
@@ -106,6 +130,7 @@ QString PopupState::popupViewId() const
 void PopupState::setPopupViewId(const QString &id)
 {
     m_popupViewId = id;
+    popupsByViewId().invalidate();
     m_dismissTransition->setDismissView(id);
 }
 
@@ -364,14 +389,7 @@ PopupState *PopupState::stateForTarget(const QString &target)
     if (auto *popup = qobject_cast<PopupState *>(stateForName(target))) {
         return popup;
     }
-    const auto states = namedStates();
-    for (NamedState *state : states) {
-        auto *popup = qobject_cast<PopupState *>(state);
-        if (popup && popup->m_popupViewId == target) {
-            return popup;
-        }
-    }
-    return nullptr;
+    return popupsByViewId().find(target);
 }
 
 void PopupState::setStoreBlockedPopups(bool store)
@@ -448,12 +466,14 @@ void PopupState::activateDismissTransition()
     if (!m_root) {
         return;
     }
+    // Handed over as a child: the machine keeps no record of such a transition, so that there is
+    // nothing for addTransition() to do besides.
     if (isActive()) {
         m_dismissTransition->setTargetState(m_root->noPopupState());
-        addTransition(m_dismissTransition);
+        m_dismissTransition->setParent(this);
     } else {
         m_dismissTransition->setTargetState(nullptr);
-        m_root->addTransition(m_dismissTransition);
+        m_dismissTransition->setParent(m_root);
     }
 }
 
@@ -593,9 +613,8 @@ void PopupState::onEntry(QEvent *e)
     storeEntryData(e);
     showUnlessBlocked();
     if (ViewStateTarget *target = ViewStateTarget::instance()) {
-        connect(target, &ViewStateTarget::activeDomainChanged, this,
-                &PopupState::activeDomainChanged);
-        connect(target, &ViewStateTarget::activeViewChanged, this, &PopupState::activeViewChanged);
+        domainConnection().connect(target, this);
+        viewConnection().connect(target, this);
     }
     unstackTransitions();
 }
@@ -609,10 +628,8 @@ void PopupState::onExit(QEvent *e)
     hidePopup(true);
     activateDismissTransition();
     if (ViewStateTarget *target = ViewStateTarget::instance()) {
-        disconnect(target, &ViewStateTarget::activeDomainChanged, this,
-                   &PopupState::activeDomainChanged);
-        disconnect(target, &ViewStateTarget::activeViewChanged, this,
-                   &PopupState::activeViewChanged);
+        domainConnection().disconnect(target, this);
+        viewConnection().disconnect(target, this);
     }
 }
 
