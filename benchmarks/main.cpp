@@ -1,4 +1,4 @@
-#include "commandline.h"
+#include "program.h"
 
 #include <QCoreApplication>
 #include <QHash>
@@ -7,6 +7,7 @@
 namespace {
 
 // What is logged costs what it costs the logging of the application: it is made up, not written.
+// What this program itself has to say does not go this way.
 void discard(QtMsgType, const QMessageLogContext &, const QString &)
 {
 }
@@ -21,5 +22,5 @@ int main(int argc, char **argv)
     // As on the target: warnings are logged, debug output is not.
     QLoggingCategory::setFilterRules(QStringLiteral("*.debug=false"));
     qInstallMessageHandler(discard);
-    return runCommandLine(application.arguments());
+    return runProgram(application.arguments());
 }

@@ -105,6 +105,10 @@ Results fromJson(const QByteArray &text, QString *error)
         WorkloadResult result;
         result.id = row.value(key("id")).toString();
         result.title = row.value(key("title")).toString();
+        if (result.id.isEmpty()) {
+            *error = QStringLiteral("workload %1 has no id").arg(results.size() + 1);
+            return Results();
+        }
         const QJsonObject sides = row.value(key("sides")).toObject();
         const QJsonObject ratios = row.value(key("timeRatios")).toObject();
         for (Engine engine : engines) {
