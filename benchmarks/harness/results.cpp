@@ -39,6 +39,25 @@ TimeRatio ratioFrom(const QJsonObject &json)
             json.value(key("high")).toDouble()};
 }
 
+WorkloadResult rowFrom(const QJsonObject &json)
+{
+    WorkloadResult result;
+    result.id = json.value(key("id")).toString();
+    result.title = json.value(key("title")).toString();
+    const QJsonObject sides = json.value(key("sides")).toObject();
+    const QJsonObject ratios = json.value(key("timeRatios")).toObject();
+    for (Engine engine : engines) {
+        const QString name = engineName(engine);
+        if (sides.contains(name)) {
+            result.sides.insert(engine, sideFrom(sides.value(name).toObject()));
+        }
+        if (ratios.contains(name)) {
+            result.timeRatios.insert(engine, ratioFrom(ratios.value(name).toObject()));
+        }
+    }
+    return result;
+}
+
 } // namespace
 
 QString engineName(Engine engine)
@@ -100,27 +119,12 @@ Results fromJson(const QByteArray &text, QString *error)
     }
     Results results;
     const QJsonArray rows = document.object().value(key("workloads")).toArray();
-    for (const QJsonValue &value : rows) {
-        const QJsonObject row = value.toObject();
-        WorkloadResult result;
-        result.id = row.value(key("id")).toString();
-        result.title = row.value(key("title")).toString();
-        if (result.id.isEmpty()) {
-            *error = QStringLiteral("workload %1 has no id").arg(results.size() + 1);
+    for (const QJsonValue &row : rows) {
+        results.append(rowFrom(row.toObject()));
+        if (results.last().id.isEmpty()) {
+            *error = QStringLiteral("workload %1 has no id").arg(results.size());
             return Results();
         }
-        const QJsonObject sides = row.value(key("sides")).toObject();
-        const QJsonObject ratios = row.value(key("timeRatios")).toObject();
-        for (Engine engine : engines) {
-            if (sides.contains(engineName(engine))) {
-                result.sides.insert(engine, sideFrom(sides.value(engineName(engine)).toObject()));
-            }
-            if (ratios.contains(engineName(engine))) {
-                result.timeRatios.insert(engine,
-                                         ratioFrom(ratios.value(engineName(engine)).toObject()));
-            }
-        }
-        results.append(result);
     }
     if (results.isEmpty()) {
         *error = QStringLiteral("no workloads in it");

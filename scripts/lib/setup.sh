@@ -54,3 +54,7 @@ Install them as root, then run this again:
 
 # What every build needs.
 build_packages=(cmake ninja-build g++ ccache qtbase5-dev)
+
+# What the benchmarks need beside that, and so the preset "release". Qt SCXML's CMake files ask for
+# Qt Qml, which its own package does not bring.
+benchmark_packages=(libqt5scxml5-dev qtdeclarative5-dev valgrind)
