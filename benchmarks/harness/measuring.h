@@ -21,11 +21,11 @@ bool measure(const Workload &workload, const Effort &effort, WorkloadResult *res
              QString *error);
 
 /**
- * Counts the instructions of @p ids in a second process of this program under valgrind's callgrind
+ * Counts the instructions of @p ids, each in a process of this program under valgrind's callgrind,
  * and adds them to @p results. False with a text in @p error when that cannot be done.
  */
 bool countInstructions(const QStringList &ids, const Effort &effort, Results *results,
                        QString *error);
 
-/** The second process's side of that: runs every workload and marks what is to be counted. */
+/** That process's side of it: runs every workload and marks what is to be counted. */
 void runForCounting(const QVector<Workload> &workloads, const Effort &effort);

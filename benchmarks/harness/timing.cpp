@@ -114,13 +114,13 @@ void keepAllocations(std::vector<Contestant> &contestants, const Workload &workl
                      WorkloadResult *result)
 {
     for (Contestant &contestant : contestants) {
-        const Allocations total = countAllocations(*contestant.flow, workload.counted);
-        const double allocations = static_cast<double>(total.count) / workload.counted;
-        const bool first = !result->sides.contains(contestant.engine);
+        const Allocations allocations = countAllocations(*contestant.flow, workload.counted);
+        const double count = static_cast<double>(allocations.count) / workload.counted;
+        const bool isFirst = !result->has(contestant.engine);
         SideResult &side = result->sides[contestant.engine];
-        if (first || allocations < side.allocations) {
-            side.allocations = allocations;
-            side.heapBytes = static_cast<double>(total.bytes) / workload.counted;
+        if (isFirst || count < side.allocations) {
+            side.allocations = count;
+            side.heapBytes = static_cast<double>(allocations.bytes) / workload.counted;
         }
     }
 }
