@@ -151,7 +151,7 @@ bool measure(const Workload &workload, const Effort &effort, WorkloadResult *res
     }
     for (auto it = times.cbegin(); it != times.cend(); ++it) {
         result->sides[it.key()].nanoseconds = quantile(it.value(), 0.5);
-        if (it.key() != Engine::Library) {
+        if (it.key() != Engine::Library && times.contains(Engine::Library)) {
             result->timeRatios[it.key()] = ratio(times.value(Engine::Library), it.value());
         }
     }

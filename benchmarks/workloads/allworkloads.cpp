@@ -2,10 +2,11 @@
 #include "lifecycle.h"
 #include "lookups.h"
 #include "popuprounds.h"
+#include "probes.h"
 #include "viewswitch.h"
 
 QVector<Workload> allWorkloads()
 {
     return viewSwitchWorkloads() + popupRoundWorkloads() + keyPressWorkloads()
-        + lifecycleWorkloads() + lookupWorkloads();
+        + lifecycleWorkloads() + lookupWorkloads() + probeWorkloads();
 }

@@ -1,0 +1,6 @@
+#pragma once
+
+#include "workload.h"
+
+/** What the library adds to a flow. */
+QVector<Workload> libraryProbes();

@@ -1,0 +1,6 @@
+#pragma once
+
+#include "workload.h"
+
+/** Parallel regions, on bare Qt. */
+QVector<Workload> regionProbes();

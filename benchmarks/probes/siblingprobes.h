@@ -1,0 +1,6 @@
+#pragma once
+
+#include "workload.h"
+
+/** Transitions of which one takes an event in place of its siblings. */
+QVector<Workload> siblingProbes();
