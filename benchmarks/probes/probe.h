@@ -8,6 +8,9 @@
 /** How many memory layouts a flow without parallel regions is run under. */
 constexpr int oneLayout = 1;
 
+/** For one with parallel regions: enough for its growth to show through the scatter. */
+constexpr int fewLayouts = 4;
+
 /** A probe with a name in place of a size; its flow, a @p Probe, is made from @p arguments. */
 template <typename Probe, typename... Arguments>
 Workload probe(Engine engine, const QString &id, const QString &title, int layouts,

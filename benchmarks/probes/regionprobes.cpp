@@ -85,7 +85,7 @@ public:
 template <typename Probe, typename... Arguments>
 QVector<Workload> inSizes(const QString &family, const QString &title, Arguments... arguments)
 {
-    return probes<Probe>(Engine::Raw, family, title, severalLayouts, {1, 2, 4, 8, 16, 32},
+    return probes<Probe>(Engine::Raw, family, title, fewLayouts, {1, 2, 4, 8, 16, 32},
                          arguments...);
 }
 

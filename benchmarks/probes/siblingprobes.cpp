@@ -158,9 +158,9 @@ QVector<Workload> siblingProbes()
                              oneLayout, {10, 100, 1000})
         + probes<AllActive>(engine, QStringLiteral("P-siblings-active"),
                             QStringLiteral("a key that %1 regions take, in one sibling group"),
-                            severalLayouts, {2, 4, 8, 16}, Grouping::Group)
+                            fewLayouts, {2, 4, 8, 16}, Grouping::Group)
         + probes<AllActive>(engine, QStringLiteral("P-siblings-none"),
                             QStringLiteral("a key that %1 regions take, without a group"),
-                            severalLayouts, {2, 4, 8, 16}, Grouping::None)
+                            fewLayouts, {2, 4, 8, 16}, Grouping::None)
         + joiningProbes();
 }
