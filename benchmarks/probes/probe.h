@@ -18,7 +18,7 @@ Workload probe(Engine engine, const QString &id, const QString &title, int layou
 {
     constexpr int timed = 20;
     // Even, since many a probe goes there and back; few where every layout is counted.
-    const int counted = layouts == oneLayout ? 6 : 2;
+    const int counted = layouts == oneLayout ? 20 : 2;
     constexpr int warmUp = 4; // every state that is used is entered at least once
     return {id, title, timed, counted, warmUp, layouts, {side<Probe>(engine, arguments...)}};
 }
