@@ -63,6 +63,7 @@ HmiViewState::HmiViewState(const QString &targetView, const QString &name, QStat
     : HmiState(name, parent), m_targetView(targetView), m_backStackStateId(name),
       m_indirectViewTransition(ownTransition<HmiViewTransition>(this))
 {
+    TargetIndex<HmiViewState>::invalidate();
 }
 
 HmiViewState::~HmiViewState()

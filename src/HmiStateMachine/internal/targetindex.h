@@ -13,28 +13,32 @@ namespace HmiStateMachine {
  *
  * It is made anew at the first search after a name has been registered or given up, by whatever
  * state, or after invalidate(): a flow that stands is searched in the same time however large it
- * is. For the thread of the machine.
+ * is. Searches belong to the thread of the machine.
  */
 template <typename State> class TargetIndex
 {
 public:
     using Id = QString (State::*)() const;
 
-    /** Does not hold for states whose @p id changes, unless invalidate() is called each time. */
     explicit TargetIndex(Id id) : m_id(id) { }
+
+    /**
+     * To be called at the end of the class's constructor and whenever the id of a state has
+     * changed, from any thread. A state is registered before its class can be told: an index that
+     * is made between the two misses it.
+     */
+    static void invalidate() { NamedState::noteRegistryChange(); }
 
     State *find(const QString &id)
     {
         // Read before the registry is walked: a change meanwhile makes the index old already.
         const int changes = NamedState::registryChanges();
-        if (!m_valid || changes != m_changes) {
+        if (changes != m_changes) {
             m_changes = changes;
             build();
         }
         return m_states.value(id, nullptr);
     }
-
-    void invalidate() { m_valid = false; }
 
 private:
     void build()
@@ -47,13 +51,11 @@ private:
                 m_states.insert((state->*m_id)(), state);
             }
         }
-        m_valid = true;
     }
 
     Id m_id;
     QHash<QString, State *> m_states;
-    int m_changes = 0;
-    bool m_valid = false;
+    int m_changes = 0; // none yet, as long as there has been no state
 };
 
 } // namespace HmiStateMachine

@@ -166,6 +166,11 @@ int NamedState::registryChanges()
     return registry().changes.loadAcquire();
 }
 
+void NamedState::noteRegistryChange()
+{
+    registry().changes.ref();
+}
+
 void NamedState::setLoggingEnabled(bool enabled)
 {
     registry().s_loggingEnabled = enabled;

@@ -130,6 +130,7 @@ private:
     template <typename State> friend class TargetIndex;
 
     static int registryChanges();
+    static void noteRegistryChange();
     void checkChildrenLater();
     void checkChildren();
     void forgetMonitor(QObject *monitor);

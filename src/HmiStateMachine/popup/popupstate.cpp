@@ -41,12 +41,6 @@ PopupRecords &records()
     return instance;
 }
 
-TargetIndex<PopupState> &popupsByViewId()
-{
-    static TargetIndex<PopupState> index(&PopupState::popupViewId);
-    return index;
-}
-
 const SlotConnection &domainConnection()
 {
     static const SlotConnection connection(&ViewStateTarget::activeDomainChanged,
@@ -95,6 +89,7 @@ PopupState::PopupState(const QString &name, PopupRootState *root, int popupKind,
       m_dismissTransition(new PopupDismissTransition(this)), m_popupKind(popupKind),
       m_autoDismissInterval(defaultAutoDismissMs)
 {
+    TargetIndex<PopupState>::invalidate();
     if (root) {
         root->addPopupState(this);
     } else if (rootExpected) {
@@ -130,7 +125,7 @@ QString PopupState::popupViewId() const
 void PopupState::setPopupViewId(const QString &id)
 {
     m_popupViewId = id;
-    popupsByViewId().invalidate();
+    TargetIndex<PopupState>::invalidate();
     m_dismissTransition->setDismissView(id);
 }
 
@@ -389,7 +384,8 @@ PopupState *PopupState::stateForTarget(const QString &target)
     if (auto *popup = qobject_cast<PopupState *>(stateForName(target))) {
         return popup;
     }
-    return popupsByViewId().find(target);
+    static TargetIndex<PopupState> byViewId(&PopupState::popupViewId);
+    return byViewId.find(target);
 }
 
 void PopupState::setStoreBlockedPopups(bool store)
