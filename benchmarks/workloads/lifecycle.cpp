@@ -1,11 +1,13 @@
 #include "lifecycle.h"
 
 #include "machineflow.h"
+#include "rawkey.h"
 #include "rawview.h"
 #include "sides.h"
 #include "viewsetup.h"
 
 #include <HmiStateMachine/hmi/hmiviewstate.h>
+#include <HmiStateMachine/named/keysignaltransition.h>
 
 namespace {
 
@@ -17,7 +19,7 @@ enum class Phase { Build, Start, Destroy };
 class RawViews : public MachineFlow
 {
 public:
-    RawViews() : m_screens(layer()) { }
+    explicit RawViews(int keys = 0) : m_keyCount(keys), m_screens(layer()) { }
     ~RawViews() override { delete m_group; }
 
 protected:
@@ -33,12 +35,17 @@ protected:
         auto *view = new Raw::View(m_screens, name, name, m_group);
         addInstanceData(view);
         view->handleBack();
+        for (int key = 0; key < m_keyCount; ++key) {
+            new Raw::KeyTransition(&m_keys, SIGNAL(keyChanged(int, int)), key, keyPressed, view);
+        }
         return view;
     }
 
     QState *m_group = nullptr;
 
 private:
+    KeySource m_keys;
+    int m_keyCount;
     Raw::Screens m_screens;
 };
 
@@ -46,9 +53,10 @@ private:
 class LibraryViews : public LibraryFlow
 {
 public:
-    explicit LibraryViews(HmiStateMachine::HmiState::PopupBehavior behavior =
+    explicit LibraryViews(int keys = 0,
+                          HmiStateMachine::HmiState::PopupBehavior behavior =
                               HmiStateMachine::HmiState::DefaultPopupBehavior)
-        : m_behavior(behavior)
+        : m_keyCount(keys), m_behavior(behavior)
     {
     }
     ~LibraryViews() override { delete m_group; }
@@ -65,12 +73,18 @@ protected:
         auto *view = new HmiStateMachine::HmiViewState(name, m_group);
         addInstanceData(view);
         view->setHandlesBackEvent(true);
+        for (int key = 0; key < m_keyCount; ++key) {
+            new HmiStateMachine::KeySignalTransition(&m_keys, SIGNAL(keyChanged(int, int)), key,
+                                                     keyPressed, view);
+        }
         return view;
     }
 
     QState *m_group = nullptr;
 
 private:
+    KeySource m_keys;
+    int m_keyCount;
     HmiStateMachine::HmiState::PopupBehavior m_behavior;
 };
 
@@ -146,7 +160,7 @@ QStringList viewNames(int count)
     return shape.viewNames();
 }
 
-Workload lifecycle(const QString &id, const QString &title, Phase phase, int views)
+Workload lifecycle(const QString &id, const QString &title, Phase phase, int views, int keys = 0)
 {
     const QStringList names = viewNames(views);
     return {QStringLiteral("W5/") + id,
@@ -155,8 +169,8 @@ Workload lifecycle(const QString &id, const QString &title, Phase phase, int vie
             views,
             views,
             1,
-            {side<Lifecycle<LibraryViews>>(Engine::Library, phase, names),
-             side<Lifecycle<RawViews>>(Engine::Raw, phase, names)}};
+            {side<Lifecycle<LibraryViews>>(Engine::Library, phase, names, keys),
+             side<Lifecycle<RawViews>>(Engine::Raw, phase, names, keys)}};
 }
 
 Workload inheriting(int views)
@@ -169,7 +183,7 @@ Workload inheriting(int views)
             views,
             views,
             1,
-            {side<Lifecycle<LibraryViews>>(Engine::Library, Phase::Build, names,
+            {side<Lifecycle<LibraryViews>>(Engine::Library, Phase::Build, names, 0,
                                            HmiState::PopupBehaviorOff),
              side<Lifecycle<RawViews>>(Engine::Raw, Phase::Build, names)}};
 }
@@ -180,12 +194,21 @@ QVector<Workload> lifecycleWorkloads()
 {
     constexpr int aFlow = 1000;
     constexpr int manyViews = 4000;
+    constexpr int someKeys = 2;
     return {lifecycle(QStringLiteral("build"), QStringLiteral("build a view state"), Phase::Build,
                       aFlow),
             lifecycle(QStringLiteral("start"), QStringLiteral("start a machine, by the view state"),
                       Phase::Start, aFlow),
             lifecycle(QStringLiteral("destroy"), QStringLiteral("destroy a view state"),
                       Phase::Destroy, aFlow),
+            lifecycle(QStringLiteral("build-keys"),
+                      QStringLiteral("build a view state with two key transitions"), Phase::Build,
+                      aFlow, someKeys),
+            lifecycle(QStringLiteral("start-keys"),
+                      QStringLiteral("start a machine of such, by the view state"), Phase::Start,
+                      aFlow, someKeys),
+            lifecycle(QStringLiteral("destroy-keys"), QStringLiteral("destroy such a view state"),
+                      Phase::Destroy, aFlow, someKeys),
             lifecycle(QStringLiteral("default"),
                       QStringLiteral("build a view state, %1 of them").arg(manyViews), Phase::Build,
                       manyViews),
