@@ -1,10 +1,14 @@
 #include <HmiStateMachine/named/keysignaltransition.h>
 
 #include <HmiStateMachine/internal/siblinggroups.h>
+#include <HmiStateMachine/internal/slotconnection.h>
 #include <HmiStateMachine/named/parallelsiblingtransitiongroup.h>
 
 #include <QMultiHash>
 #include <QStateMachine>
+
+#include <iterator>
+#include <limits>
 
 namespace HmiStateMachine {
 
@@ -18,14 +22,50 @@ Transitions &publishedTransitions()
     return transitions;
 }
 
+void append(QString &text, quintptr number, uint base)
+{
+    static const char digits[] = "0123456789abcdef";
+    QChar written[std::numeric_limits<quintptr>::digits10 + 1];
+    QChar *const end = std::end(written);
+    QChar *begin = end;
+    do {
+        *--begin = QLatin1Char(digits[number % base]);
+        number /= base;
+    } while (number > 0);
+    text.append(begin, static_cast<int>(end - begin));
+}
+
+void append(QString &text, int number)
+{
+    const bool negative = number < 0;
+    text.append(negative ? QLatin1String("::-") : QLatin1String("::"));
+    // Widened first: the smallest number has no positive counterpart of its own type.
+    const auto wide = static_cast<qint64>(number);
+    append(text, static_cast<quintptr>(negative ? -wide : wide), 10);
+}
+
+// Into one string that is large enough from the start: every key transition has such a key.
 QString transitionKey(const QObject *sender, const char *signal, const QList<int> &keys, int status)
 {
-    const QString address = QString::number(reinterpret_cast<quintptr>(sender), 16);
-    QString result = QStringLiteral("%1::%2").arg(address, QString::fromLatin1(signal));
+    constexpr int usualSize = 48;
+    QString result;
+    result.reserve(usualSize);
+    append(result, reinterpret_cast<quintptr>(sender), 16);
+    result.append(QLatin1String("::")).append(QLatin1String(signal));
     for (int key : keys) {
-        result += QStringLiteral("::%1").arg(key);
+        append(result, key);
     }
-    return result + QStringLiteral("::%1").arg(status);
+    append(result, status);
+    result.squeeze();
+    return result;
+}
+
+const SlotConnection &triggeredConnection()
+{
+    static const SlotConnection connection(&QAbstractTransition::triggered,
+                                           KeySignalTransition::staticMetaObject,
+                                           "onTransitionTriggered()");
+    return connection;
 }
 
 // False for what is no number, such as a text that cannot be read as one.
@@ -50,7 +90,7 @@ KeySignalTransition::KeySignalTransition(QObject *sender, const char *signal, QL
       m_transitionKey(transitionKey(sender, signal, keys, status)), m_keys(keys), m_status(status)
 {
     setAllowTransitionDefault(true);
-    connect(this, SIGNAL(triggered()), this, SLOT(onTransitionTriggered()));
+    triggeredConnection().connect(this, this);
 }
 
 KeySignalTransition::~KeySignalTransition()
