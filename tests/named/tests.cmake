@@ -1,3 +1,4 @@
+hmi_add_test(named childchecks)
 hmi_add_test(named guardedpropertychangetransition)
 hmi_add_test(named guardedpropertytransition)
 hmi_add_test(named guardedsignaltransition)

@@ -1,6 +1,7 @@
 #include <HmiStateMachine/named/namedstate.h>
 
 #include <HmiStateMachine/hmi/hmisignaltransition.h>
+#include <HmiStateMachine/internal/childchecks.h>
 #include <HmiStateMachine/internal/logging.h>
 #include <HmiStateMachine/internal/metatypes.h>
 #include <HmiStateMachine/named/keysignaltransition.h>
@@ -98,6 +99,9 @@ NamedState::NamedState(const QString &name, QState::ChildMode childMode, QState 
 
 NamedState::~NamedState()
 {
+    if (m_childCheckPlace != noPlace) {
+        ChildChecks::ofThisThread().remove(this);
+    }
     // The list of monitors goes before the base does: from here on no monitor's end may reach it,
     // this state's own included.
     for (const NamedState *monitor : qAsConst(m_monitoringStates)) {
@@ -255,11 +259,18 @@ bool NamedState::event(QEvent *e)
 {
     if (e->type() == QEvent::ChildAdded) {
         QObject *child = static_cast<QChildEvent *>(e)->child();
-        if (child->metaObject() == &QObject::staticMetaObject) {
-            checkChildrenLater();
-        } else {
+        // A child that is made with this state as its parent announces itself from the constructor
+        // of QObject, as yet a mere QObject. It is looked at again when the event loop runs, or on
+        // entry.
+        if (child->metaObject() != &QObject::staticMetaObject) {
             transitionTypeTest(child);
+        } else if (m_childCheckPlace == noPlace) {
+            ChildChecks::ofThisThread().add(this);
         }
+    } else if (e->type() == QEvent::ThreadChange && m_childCheckPlace != noPlace) {
+        // The children are all whole when they move.
+        ChildChecks::ofThisThread().remove(this);
+        checkChildren();
     }
     return QState::event(e);
 }
@@ -267,7 +278,8 @@ bool NamedState::event(QEvent *e)
 void NamedState::onEntry(QEvent *e)
 {
     m_active = true;
-    if (m_childrenUnchecked) {
+    if (m_childCheckPlace != noPlace) {
+        ChildChecks::ofThisThread().remove(this);
         checkChildren();
     }
     if (!m_monitoringStates.isEmpty()) {
@@ -319,21 +331,8 @@ void NamedState::monitoredStateExited(QEvent *e)
     Q_UNUSED(e)
 }
 
-// A child that is made with this state as its parent announces itself from the constructor of
-// QObject, as yet a mere QObject. It is looked at again when the event loop runs, or on entry.
-void NamedState::checkChildrenLater()
-{
-    if (m_childrenUnchecked) {
-        return;
-    }
-    m_childrenUnchecked = true;
-    QMetaObject::invokeMethod(
-        this, [this] { checkChildren(); }, Qt::QueuedConnection);
-}
-
 void NamedState::checkChildren()
 {
-    m_childrenUnchecked = false;
     const QObjectList list = children();
     for (QObject *child : list) {
         transitionTypeTest(child);

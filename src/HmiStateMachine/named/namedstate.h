@@ -8,6 +8,7 @@
 
 namespace HmiStateMachine {
 
+class ChildChecks;
 class HmiSignalTransition;
 template <typename State> class TargetIndex;
 
@@ -127,19 +128,21 @@ public:
 private:
     Q_DISABLE_COPY(NamedState)
 
+    friend class ChildChecks;
     template <typename State> friend class TargetIndex;
+
+    static constexpr int noPlace = -1;
 
     static int registryChanges();
     static void noteRegistryChange();
-    void checkChildrenLater();
     void checkChildren();
     void forgetMonitor(QObject *monitor);
     QString path() const;
 
     Identifier m_name;
     bool m_active = false;
+    int m_childCheckPlace = noPlace; // here, where it takes no room of its own
     QList<NamedState *> m_monitoringStates;
-    bool m_childrenUnchecked = false;
 };
 
 } // namespace HmiStateMachine
