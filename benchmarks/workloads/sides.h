@@ -20,4 +20,4 @@ template <template <typename> class Work> QVector<Workload::Side> libraryAndRaw(
 }
 
 /** How many memory layouts a flow with parallel regions is run under. */
-constexpr int severalLayouts = 6;
+constexpr int severalLayouts = 16;
