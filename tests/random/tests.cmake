@@ -1,4 +1,16 @@
+hmi_add_test(random interruptionlookup)
 hmi_add_test(random popuprandom)
+hmi_add_test(random targetlookup)
+foreach(name IN ITEMS interruptionlookup popuprandom targetlookup)
+    target_sources(tst_${name} PRIVATE random/seeds.cpp random/seeds.h)
+    # Each step costs many times more there; the seeds and the rules stay the same.
+    if(HMISTATEMACHINE_SANITIZE)
+        set_tests_properties(${name} PROPERTIES ENVIRONMENT HMI_RANDOM_STEPS=2000)
+    endif()
+endforeach()
+# It is not exported, and tested for itself only in how its hashes spread.
+target_sources(tst_interruptionlookup PRIVATE
+    ${PROJECT_SOURCE_DIR}/src/HmiStateMachine/internal/rulename.cpp)
 target_sources(tst_popuprandom PRIVATE
     random/eventwatch.cpp
     random/eventwatch.h
@@ -20,7 +32,3 @@ target_sources(tst_popuprandom PRIVATE
     random/world.h)
 target_include_directories(tst_popuprandom PRIVATE random)
 set_tests_properties(popuprandom PROPERTIES TIMEOUT 120)
-# Each step costs many times more there; the seeds and the rules stay the same.
-if(HMISTATEMACHINE_SANITIZE)
-    set_tests_properties(popuprandom PROPERTIES ENVIRONMENT HMI_RANDOM_STEPS=2000)
-endif()

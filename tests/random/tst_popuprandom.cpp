@@ -1,7 +1,7 @@
 #include "librarytest.h"
 #include "run.h"
+#include "seeds.h"
 
-#include <QDateTime>
 #include <QtTest>
 
 #include <cstdio>
@@ -52,36 +52,18 @@ QStringList texts(const QVector<Step> &steps)
     return result;
 }
 
-int numberOfSteps()
-{
-    bool set = false;
-    const int steps = qEnvironmentVariableIntValue("HMI_RANDOM_STEPS", &set);
-    return set ? steps : defaultSteps;
-}
-
 } // namespace
 
 void tst_PopupRandom::whatMustHoldHoldsAfterEachStep_data()
 {
-    QTest::addColumn<quint32>("seed");
-
-    const QByteArray chosen = qgetenv("HMI_RANDOM_SEED");
-    if (!chosen.isEmpty()) {
-        QTest::newRow("seed " + chosen) << chosen.toUInt();
-        return;
-    }
-    for (const quint32 seed : {1u, 22u, 333u, 4444u}) {
-        QTest::addRow("seed %u", seed) << seed;
-    }
-    const auto now = static_cast<quint32>(QDateTime::currentSecsSinceEpoch());
-    QTest::addRow("seed of the clock %u", now) << now;
+    addSeedRows();
 }
 
 void tst_PopupRandom::whatMustHoldHoldsAfterEachStep()
 {
     QFETCH(quint32, seed);
     const Runner runner(seed, messages());
-    const QVector<Step> steps = makeSteps(seed, numberOfSteps());
+    const QVector<Step> steps = makeSteps(seed, numberOfSteps(defaultSteps));
 
     const auto failure = runner.run(steps);
 
