@@ -107,6 +107,7 @@ private Q_SLOTS:
     void aPopupThatWaitsDoesNotFollow();
     void aRetriedPopupFollowsOnceWhileItIsShown();
     void popupsOfTwoLayersFollowInTheOrderOfTheirEntry();
+    void aPopupThatWasLeftWhileTheViewLayerWasAwayFollowsNoMoreOnceItIsBack();
 };
 
 void tst_PopupWiring::transitionsHangWhereTheStepsLeaveThem_data()
@@ -271,6 +272,26 @@ void tst_PopupWiring::popupsOfTwoLayersFollowInTheOrderOfTheirEntry()
     flow.take();
     flow.target.setActiveDomain(blocking);
     QCOMPARE(flow.take(), upperHidden + lowerHidden);
+}
+
+void tst_PopupWiring::aPopupThatWasLeftWhileTheViewLayerWasAwayFollowsNoMoreOnceItIsBack()
+{
+    PopupFlow flow(messages());
+    flow.popup("wiringaway/fuel", "WiringAwayView");
+    blockInDomain(flow, "WiringAwayView");
+    flow.start();
+    flow.request("wiringaway/fuel");
+    ViewStateTarget::VIEW_STATE_TARGET_INSTANCE = nullptr;
+    flow.request("wiringaway/fuel_Dismiss");
+    ViewStateTarget::VIEW_STATE_TARGET_INSTANCE = &flow.target;
+
+    flow.request("wiringaway/fuel");
+    flow.request("wiringaway/fuel_Dismiss");
+    flow.take();
+    flow.target.setActiveDomain(blocking);
+    flow.target.setActiveView("Map");
+
+    QCOMPARE(flow.take(), QStringList());
 }
 
 QTEST_GUILESS_MAIN(tst_PopupWiring)

@@ -26,9 +26,10 @@ public:
         QMetaObject::connect(sender, m_signal, receiver, m_slot);
     }
 
+    /** Cuts it as often as it was made. */
     void disconnect(const QObject *sender, const QObject *receiver) const
     {
-        QMetaObject::disconnectOne(sender, m_signal, receiver, m_slot);
+        QMetaObject::disconnect(sender, m_signal, receiver, m_slot);
     }
 
 private:
