@@ -1,9 +1,12 @@
 #include "driving.h"
 #include "emitter.h"
+#include "guards.h"
 #include "journal.h"
 #include "librarytest.h"
+#include "twostates.h"
 
 #include <HmiStateMachine/hmi/hmisignaltransition.h>
+#include <HmiStateMachine/named/guardedsignaltransition.h>
 #include <HmiStateMachine/named/guardedtransition.h>
 #include <HmiStateMachine/named/hmievent.h>
 #include <HmiStateMachine/named/hmitransition.h>
@@ -11,6 +14,7 @@
 #include <HmiStateMachine/named/intsignaltransition.h>
 #include <HmiStateMachine/named/keysignaltransition.h>
 #include <HmiStateMachine/named/namedstate.h>
+#include <HmiStateMachine/named/parallelsiblingtransitiongroup.h>
 #include <HmiStateMachine/named/simpleeventtransition.h>
 #include <HmiStateMachine/named/statemachine.h>
 
@@ -69,7 +73,54 @@ template <typename Transition> void rank(Transition *screen, Transition *volume)
     QVERIFY(screen->makeParallelExclusive(20));
 }
 
+// Transitions that refuse the plain signal of an emitter themselves.
+
+NamedTargetTransitionBase *onAnotherSignal(Emitter &emitter, QState *source)
+{
+    return new HmiSignalTransition(&emitter, SIGNAL(other()), source);
+}
+
+NamedTargetTransitionBase *blocked(Emitter &emitter, QState *source)
+{
+    auto *transition = new HmiSignalTransition(&emitter, SIGNAL(plain()), source);
+    transition->setBlocked(true);
+    return transition;
+}
+
+NamedTargetTransitionBase *refusingSignals(Emitter &emitter, QState *source)
+{
+    return new GuardedSignalTransition(&emitter, SIGNAL(plain()), source);
+}
+
+NamedTargetTransitionBase *onANumber(Emitter &emitter, QState *source)
+{
+    return new IntSignalTransition(&emitter, SIGNAL(plain()), 1, source);
+}
+
+NamedTargetTransitionBase *onAKey(Emitter &emitter, QState *source)
+{
+    return new KeySignalTransition(&emitter, SIGNAL(plain()), 1, 0, source);
+}
+
+NamedTargetTransitionBase *refusing(Emitter &, QState *source)
+{
+    return new GuardedTransition(source);
+}
+
+NamedTargetTransitionBase *onAnEventType(Emitter &, QState *source)
+{
+    return new SimpleEventTransition(QEvent::User, source);
+}
+
+NamedTargetTransitionBase *onAnEvent(Emitter &, QState *source)
+{
+    return new HmiTransition("Asks no sibling", source);
+}
+
 } // namespace
+
+using MakeRefusing = NamedTargetTransitionBase *(*)(Emitter &, QState *);
+Q_DECLARE_METATYPE(MakeRefusing)
 
 class tst_Arbitration : public LibraryTest
 {
@@ -86,6 +137,9 @@ private Q_SLOTS:
     void aNumberGoesToWhomItSuits();
     void aKeyGoesToOneRegion();
     void aTransitionRemovedAtRunTimeSetsItsSiblingsFree();
+    void whoRefusesItselfAsksNoSibling_data();
+    void whoRefusesItselfAsksNoSibling();
+    void whoAcceptsItselfAsksItsSiblingOnce();
 };
 
 void tst_Arbitration::withoutPrioritiesBothRegionsReact()
@@ -253,6 +307,61 @@ void tst_Arbitration::aTransitionRemovedAtRunTimeSetsItsSiblingsFree()
     unit.post("Turn until removed");
 
     QCOMPARE(journal.lines(), QStringList{"enter Loud"});
+}
+
+void tst_Arbitration::whoRefusesItselfAsksNoSibling_data()
+{
+    QTest::addColumn<MakeRefusing>("make");
+
+    QTest::newRow("on another signal") << MakeRefusing(onAnotherSignal);
+    QTest::newRow("blocked") << MakeRefusing(blocked);
+    QTest::newRow("refusing by its guard") << MakeRefusing(refusingSignals);
+    QTest::newRow("on a number") << MakeRefusing(onANumber);
+    QTest::newRow("on a key") << MakeRefusing(onAKey);
+    QTest::newRow("refusing all events") << MakeRefusing(refusing);
+    QTest::newRow("on a type of events") << MakeRefusing(onAnEventType);
+    QTest::newRow("on an event of a name") << MakeRefusing(onAnEvent);
+}
+
+void tst_Arbitration::whoRefusesItselfAsksNoSibling()
+{
+    QFETCH(MakeRefusing, make);
+    Journal journal;
+    Emitter emitter;
+    ParallelSiblingTransitionGroup group;
+    TwoRegions regions;
+    NamedTargetTransitionBase *low = make(emitter, regions.left);
+    GuardedSignalTransition high(&emitter, SIGNAL(plain()), regions.right);
+    record(&high, "high", journal);
+    QVERIFY(group.addTransition(low, 1));
+    QVERIFY(group.addTransition(&high, 2));
+    regions.start();
+
+    Q_EMIT emitter.plain();
+
+    // By the machine, for itself.
+    QCOMPARE(journal.lines(), QStringList({"high asked", "high refused"}));
+}
+
+void tst_Arbitration::whoAcceptsItselfAsksItsSiblingOnce()
+{
+    Journal journal;
+    Emitter emitter;
+    TwoRegions regions;
+    GuardedSignalTransition low(&emitter, SIGNAL(plain()), regions.left);
+    GuardedSignalTransition high(&emitter, SIGNAL(plain()), regions.right);
+    record(&low, "low", journal);
+    record(&high, "high", journal);
+    answer(&low, true);
+    QVERIFY(low.makeParallelExclusive(1));
+    QVERIFY(high.makeParallelExclusive(2));
+    regions.start();
+
+    Q_EMIT emitter.plain();
+
+    QCOMPARE(journal.lines(),
+             QStringList({"low asked", "high asked", "high refused", // by the lower one
+                          "high asked", "high refused"})); // by the machine
 }
 
 QTEST_GUILESS_MAIN(tst_Arbitration)

@@ -8,6 +8,7 @@
 #include <HmiStateMachine/hmi/hmilayeredstate.h>
 #include <HmiStateMachine/hmi/hmisignaltransition.h>
 #include <HmiStateMachine/hmi/hmistate.h>
+#include <HmiStateMachine/hmi/hmiviewstate.h>
 #include <HmiStateMachine/named/hmitransition.h>
 #include <HmiStateMachine/named/keysignaltransition.h>
 
@@ -66,12 +67,16 @@ private Q_SLOTS:
     void aStateIsConstructedByNameOrWithout();
     void aChildStartsWithTheBehaviorOfItsParent_data();
     void aChildStartsWithTheBehaviorOfItsParent();
+    void childrenOfAChildStartWithTheBehaviorToo();
+    void startingWithABehaviorIsNotAnnouncedLater();
     void aStateUnderAnotherKindOfStateStartsWithTheDefault();
     void aChildFollowsLaterChangesOfItsParent();
     void aChangePassesDownTheWholeTree();
     void settingTheSameBehaviorEmitsNothing();
     void anOwnBehaviorCutsTheInheritanceForGood();
     void settingTheInheritedBehaviorKeepsTheInheritance();
+    void anOwnBehaviorOfAChildOfAChildCutsItAlone();
+    void anOwnBehaviorOverAnInheritedOneCutsIt();
     void anOwnBehaviorIsPassedOnToTheChildren();
     void takingOverABehaviorKeepsTheInheritance();
     void theNewBehaviorIsStoredWhenItIsAnnounced();
@@ -156,6 +161,38 @@ void tst_HmiState::aChildStartsWithTheBehaviorOfItsParent()
     QCOMPARE(int(unnamed->popupBehavior()), behavior);
 }
 
+void tst_HmiState::childrenOfAChildStartWithTheBehaviorToo()
+{
+    HmiState top("Top");
+    top.setPopupBehavior(HmiState::PopupBehaviorOff);
+    auto *child = new HmiState("Child", &top);
+    auto *view = new HmiViewState("View", child);
+    auto *unnamed = new HmiState(view);
+
+    QCOMPARE(view->popupBehavior(), HmiState::PopupBehaviorOff);
+    QCOMPARE(unnamed->popupBehavior(), HmiState::PopupBehaviorOff);
+
+    top.setPopupBehavior(HmiState::PopupBehaviorOn);
+
+    QCOMPARE(view->popupBehavior(), HmiState::PopupBehaviorOn);
+    QCOMPARE(unnamed->popupBehavior(), HmiState::PopupBehaviorOn);
+}
+
+void tst_HmiState::startingWithABehaviorIsNotAnnouncedLater()
+{
+    HmiState parent("Parent");
+    parent.setPopupBehavior(HmiState::PopupBehaviorOn);
+
+    HmiState child("Child", &parent);
+    QSignalSpy changes(&child, &HmiState::popupBehaviorChanged);
+    QSignalSpy changesOfParent(&parent, &HmiState::popupBehaviorChanged);
+    QVERIFY(changes.isValid() && changesOfParent.isValid());
+    settle();
+
+    QCOMPARE(changes.size(), 0);
+    QCOMPARE(changesOfParent.size(), 0);
+}
+
 void tst_HmiState::aStateUnderAnotherKindOfStateStartsWithTheDefault()
 {
     HmiState top("Top");
@@ -238,6 +275,36 @@ void tst_HmiState::settingTheInheritedBehaviorKeepsTheInheritance()
     parent.setPopupBehavior(HmiState::PopupBehaviorOff);
 
     QCOMPARE(child->popupBehavior(), HmiState::PopupBehaviorOff);
+}
+
+void tst_HmiState::anOwnBehaviorOfAChildOfAChildCutsItAlone()
+{
+    HmiState top("Top");
+    top.setPopupBehavior(HmiState::PopupBehaviorOff);
+    auto *middle = new HmiState("Middle", &top);
+    auto *leaf = new HmiState("Leaf", middle);
+    auto *other = new HmiState("Other", middle);
+
+    leaf->setPopupBehavior(HmiState::DefaultPopupBehavior);
+    top.setPopupBehavior(HmiState::PopupBehaviorOn);
+
+    QCOMPARE(leaf->popupBehavior(), HmiState::DefaultPopupBehavior);
+    QCOMPARE(other->popupBehavior(), HmiState::PopupBehaviorOn);
+}
+
+void tst_HmiState::anOwnBehaviorOverAnInheritedOneCutsIt()
+{
+    HmiState parent("Parent");
+    parent.setPopupBehavior(HmiState::PopupBehaviorOn);
+    auto *child = new HmiState("Child", &parent);
+    auto *unnamed = new HmiState(&parent);
+
+    child->setPopupBehavior(HmiState::DefaultPopupBehavior);
+    unnamed->setPopupBehavior(HmiState::DefaultPopupBehavior);
+    parent.setPopupBehavior(HmiState::PopupBehaviorOff);
+
+    QCOMPARE(child->popupBehavior(), HmiState::DefaultPopupBehavior);
+    QCOMPARE(unnamed->popupBehavior(), HmiState::DefaultPopupBehavior);
 }
 
 void tst_HmiState::anOwnBehaviorIsPassedOnToTheChildren()

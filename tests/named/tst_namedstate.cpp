@@ -6,6 +6,7 @@
 #include "metadescription.h"
 
 #include <HmiStateMachine/hmi/hmisignaltransition.h>
+#include <HmiStateMachine/hmi/hmiviewstate.h>
 #include <HmiStateMachine/internal/logging.h>
 #include <HmiStateMachine/named/hmievent.h>
 #include <HmiStateMachine/named/hmitransition.h>
@@ -84,6 +85,27 @@ class DerivedRawTransition : public QSignalTransition
 
 public:
     using QSignalTransition::QSignalTransition;
+};
+
+// Without a meta-object of its own.
+class PlainDerivedRawTransition : public QSignalTransition
+{
+public:
+    using QSignalTransition::QSignalTransition;
+};
+
+class DerivedTransition : public HmiSignalTransition
+{
+    Q_OBJECT
+
+public:
+    using HmiSignalTransition::HmiSignalTransition;
+};
+
+class PlainDerivedTransition : public HmiSignalTransition
+{
+public:
+    using HmiSignalTransition::HmiSignalTransition;
 };
 
 // Two screens that an emitter changes between, the second one watched by the test.
@@ -238,6 +260,78 @@ void constructRawAndAdd(Flow &flow)
     flow.away->addTransition(transition);
 }
 
+void reparentDerivedRaw(Flow &flow)
+{
+    DerivedRawTransition transition(&flow.emitter, SIGNAL(other()));
+    transition.setParent(flow.away);
+}
+
+void constructDerivedRaw(Flow &flow)
+{
+    new DerivedRawTransition(&flow.emitter, SIGNAL(other()), flow.away);
+    settle();
+}
+
+void addPlainDerivedRaw(Flow &flow)
+{
+    flow.away->addTransition(new PlainDerivedRawTransition(&flow.emitter, SIGNAL(other())));
+}
+
+void constructPlainDerivedRaw(Flow &flow)
+{
+    new PlainDerivedRawTransition(&flow.emitter, SIGNAL(other()), flow.away);
+    settle();
+}
+
+// A view state has transitions of its own, which it is not asked to look at.
+
+void constructRawInAViewState(Flow &flow)
+{
+    auto *view = new HmiViewState("View", &flow.machine);
+    new QSignalTransition(&flow.emitter, SIGNAL(other()), view);
+    settle();
+}
+
+void addRawToAViewState(Flow &flow)
+{
+    auto *view = new HmiViewState("View", &flow.machine);
+    view->addTransition(new QSignalTransition(&flow.emitter, SIGNAL(other())));
+}
+
+void reparentRawToAViewState(Flow &flow)
+{
+    auto *view = new HmiViewState("View", &flow.machine);
+    QSignalTransition transition(&flow.emitter, SIGNAL(other()));
+    transition.setParent(view);
+}
+
+void constructRawInAViewStateThatGoesBack(Flow &flow)
+{
+    auto *view = new HmiViewState("View", &flow.machine);
+    view->setHandlesBackEvent(true);
+    new QSignalTransition(&flow.emitter, SIGNAL(other()), view);
+    settle();
+}
+
+void constructRawInAViewStateThatGoesBackNoMore(Flow &flow)
+{
+    auto *view = new HmiViewState("View", &flow.machine);
+    view->setHandlesBackEvent(true);
+    settle();
+    view->setHandlesBackEvent(false);
+    new QSignalTransition(&flow.emitter, SIGNAL(other()), view);
+    settle();
+}
+
+void constructRawInAViewStateUntilItIsEntered(Flow &flow)
+{
+    auto *view = new HmiViewState("View", &flow.machine);
+    view->setHandlesBackEvent(true);
+    flow.home->addTransition(&flow.emitter, SIGNAL(withInt(int)), view);
+    new QSignalTransition(&flow.emitter, SIGNAL(other()), view);
+    Q_EMIT flow.emitter.withInt(1);
+}
+
 void testRaw(Flow &flow)
 {
     QSignalTransition transition(&flow.emitter, SIGNAL(other()));
@@ -319,6 +413,7 @@ private Q_SLOTS:
     void aRawSignalTransitionEndsTheProcess_data();
     void aRawSignalTransitionEndsTheProcess();
     void otherChildrenAreWelcome();
+    void derivedTransitionsAreWelcome();
     void aRawTransitionThatIsGoneInTimeDoesNoHarm();
     void nothingIsNoRawTransition();
 
@@ -1192,6 +1287,17 @@ void tst_NamedState::aRawSignalTransitionEndsTheProcess_data()
     QTest::newRow("constructed beside a proper one") << Misuse(constructRawBesideAProperOne);
     QTest::newRow("constructed after a check") << Misuse(constructRawAfterAnEarlierCheck);
     QTest::newRow("constructed and added") << Misuse(constructRawAndAdd);
+    QTest::newRow("derived and reparented") << Misuse(reparentDerivedRaw);
+    QTest::newRow("derived and constructed") << Misuse(constructDerivedRaw);
+    QTest::newRow("derived plainly and added") << Misuse(addPlainDerivedRaw);
+    QTest::newRow("derived plainly and constructed") << Misuse(constructPlainDerivedRaw);
+    QTest::newRow("constructed in a view") << Misuse(constructRawInAViewState);
+    QTest::newRow("added to a view") << Misuse(addRawToAViewState);
+    QTest::newRow("reparented to a view") << Misuse(reparentRawToAViewState);
+    QTest::newRow("in a view that goes back") << Misuse(constructRawInAViewStateThatGoesBack);
+    QTest::newRow("in a view that goes back no more")
+        << Misuse(constructRawInAViewStateThatGoesBackNoMore);
+    QTest::newRow("in a view until entry") << Misuse(constructRawInAViewStateUntilItIsEntered);
     QTest::newRow("tested") << Misuse(testRaw);
 }
 
@@ -1234,6 +1340,26 @@ void tst_NamedState::otherChildrenAreWelcome()
 
     QCOMPARE(flow.machine.configuration(), QSet<QAbstractState *>({flow.away, inner}));
     QCOMPARE(flow.away->transitions().size(), 7);
+}
+
+void tst_NamedState::derivedTransitionsAreWelcome()
+{
+    Flow flow;
+    auto *view = new HmiViewState("View", &flow.machine);
+    for (QState *state : {static_cast<QState *>(flow.away), static_cast<QState *>(view)}) {
+        state->addTransition(new DerivedTransition(&flow.emitter, SIGNAL(other())));
+        new DerivedTransition(&flow.emitter, SIGNAL(other()), state);
+        new PlainDerivedTransition(&flow.emitter, SIGNAL(other()), state);
+        (new PlainDerivedTransition(&flow.emitter, SIGNAL(other())))->setParent(state);
+    }
+    view->setHandlesBackEvent(true);
+    flow.away->addTransition(&flow.emitter, SIGNAL(withInt(int)), view);
+    startIn(flow.machine, flow.home);
+
+    Q_EMIT flow.emitter.plain();
+    Q_EMIT flow.emitter.withInt(1);
+
+    QCOMPARE(flow.machine.configuration(), QSet<QAbstractState *>({view}));
 }
 
 void tst_NamedState::aRawTransitionThatIsGoneInTimeDoesNoHarm()

@@ -13,6 +13,7 @@
 #include <QtTest>
 
 #include <limits>
+#include <memory>
 #include <optional>
 
 using namespace HmiStateMachine;
@@ -61,6 +62,8 @@ private Q_SLOTS:
     void anotherPriorityIsRefusedAndLogged();
     void withDebugOffTheRefusalIsSilent();
     void aTakenPriorityIsRefusedSilently();
+    void aRefusedPriorityStaysFree();
+    void aPriorityIsTakenOnceHoweverOftenItIsGiven();
     void prioritiesMayRepeatInAnotherGroup();
     void withoutASourceATransitionTakesNoPriority();
     void withoutASourceATransitionRanksAtZero_data();
@@ -83,6 +86,8 @@ private Q_SLOTS:
     void aDestroyedTransitionIsNeverReachedAgain();
     void aDestroyedInactiveSourceTakesItsTransitionAlong();
     void thePriorityOfADestroyedTransitionStaysTaken();
+    void aPriorityStaysTakenWhenItsTransitionMovesAndDies();
+    void thePriorityOfATransitionWithoutASourceIsNotTakenByItsEnd();
     void aTransitionAtTheSameAddressIsANewOne();
     void aNewTransitionAtTheSameAddressMayJoin();
     void aGuardMayDestroyASibling();
@@ -403,6 +408,34 @@ void tst_ParallelSiblingTransitionGroup::aTakenPriorityIsRefusedSilently()
 
     // Outside of the group it neither yields nor takes the event from anybody.
     QCOMPARE(regions.active(), QStringList({"RadioHome", "MapAway", "PhoneAway"}));
+}
+
+void tst_ParallelSiblingTransitionGroup::aRefusedPriorityStaysFree()
+{
+    ParallelSiblingTransitionGroup group;
+    NamedState source("RefusedSource");
+    HmiTransition first("Go", &source);
+    HmiTransition second("Go", &source);
+    QVERIFY(group.addTransition(&first, 1));
+
+    QCOMPARE(group.addTransition(&first, 2), false);
+
+    QCOMPARE(group.addTransition(&second, 2), true);
+}
+
+void tst_ParallelSiblingTransitionGroup::aPriorityIsTakenOnceHoweverOftenItIsGiven()
+{
+    ParallelSiblingTransitionGroup group;
+    NamedState source("OftenSource");
+    auto *first = new HmiTransition("Go", &source);
+    HmiTransition second("Go", &source);
+    QVERIFY(group.addTransition(first, 0));
+    QVERIFY(group.addTransition(first, 0));
+
+    delete first;
+
+    QCOMPARE(group.addTransition(&second, 0), false);
+    QCOMPARE(group.addTransition(&second, 1), true);
 }
 
 void tst_ParallelSiblingTransitionGroup::prioritiesMayRepeatInAnotherGroup()
@@ -782,6 +815,36 @@ void tst_ParallelSiblingTransitionGroup::thePriorityOfADestroyedTransitionStaysT
     QCOMPARE(group.addTransition(&late, -2), false);
     QCOMPARE(group.addTransition(&late, 3), true);
     QCOMPARE(messages().take(), QStringList());
+}
+
+void tst_ParallelSiblingTransitionGroup::aPriorityStaysTakenWhenItsTransitionMovesAndDies()
+{
+    ParallelSiblingTransitionGroup group;
+    NamedState source("MovingSource");
+    HmiTransition late("Go", &source);
+    {
+        NamedState other("MovingOther");
+        auto *moved = new HmiTransition("Go", &source);
+        QVERIFY(group.addTransition(moved, 1));
+        moved->setParent(&other);
+        QCOMPARE(group.addTransition(&late, 1), false);
+    }
+
+    QCOMPARE(group.addTransition(&late, 1), false);
+    QCOMPARE(group.addTransition(&late, 2), true);
+}
+
+void tst_ParallelSiblingTransitionGroup::thePriorityOfATransitionWithoutASourceIsNotTakenByItsEnd()
+{
+    ParallelSiblingTransitionGroup group;
+    NamedState source("EndingSource");
+    HmiTransition late("Go", &source);
+    auto homeless = std::make_unique<HmiTransition>("Go");
+    QVERIFY(group.addTransition(homeless.get(), 1));
+
+    homeless.reset();
+
+    QCOMPARE(group.addTransition(&late, 1), true);
 }
 
 void tst_ParallelSiblingTransitionGroup::aTransitionAtTheSameAddressIsANewOne()
