@@ -221,6 +221,25 @@ private:
     PlainRules m_plain;
 };
 
+/** Texts of one length that, put into @p entry, have the same hash; a handful among so many. */
+QVector<QPair<QString, QString>> partsOfOneHash(const QString &entry)
+{
+    constexpr int first = 100000;
+    constexpr int last = 399999;
+    QHash<uint, QString> byHash;
+    byHash.reserve(last - first + 1);
+    QVector<QPair<QString, QString>> result;
+    for (int number = first; number <= last; ++number) {
+        const QString part = QString::number(number);
+        QString &other = byHash[qHash(RuleName(entry.arg(part)))];
+        if (!other.isEmpty()) {
+            result.append({other, part});
+        }
+        other = part;
+    }
+    return result;
+}
+
 } // namespace
 
 class tst_InterruptionLookup : public LibraryTest
@@ -232,8 +251,12 @@ private Q_SLOTS:
     void everyAnswerIsThatOfPlainTables();
     void theWildCardsOfANameAreItsParts_data();
     void theWildCardsOfANameAreItsParts();
+    void namesOfOneHashAreToldApart_data();
+    void namesOfOneHashAreToldApart();
     void namesThatDifferInOneCharacterSpreadOverTheTable_data();
     void namesThatDifferInOneCharacterSpreadOverTheTable();
+    void namesThatDifferInEveryFourthCharacterHaveHashesOfTheirOwn_data();
+    void namesThatDifferInEveryFourthCharacterHaveHashesOfTheirOwn();
 };
 
 void tst_InterruptionLookup::everyAnswerIsThatOfPlainTables_data()
@@ -278,6 +301,42 @@ void tst_InterruptionLookup::theWildCardsOfANameAreItsParts()
     }
 }
 
+void tst_InterruptionLookup::namesOfOneHashAreToldApart_data()
+{
+    QTest::addColumn<QString>("entry");
+    QTest::addColumn<QString>("question");
+
+    QTest::newRow("names") << "module/%1"
+                           << "module/%1";
+    QTest::newRow("a popup of any module") << "*/%1"
+                                           << "module/%1";
+    QTest::newRow("any popup of a module") << "%1/*"
+                                           << "%1/popup";
+}
+
+void tst_InterruptionLookup::namesOfOneHashAreToldApart()
+{
+    QFETCH(QString, entry);
+    QFETCH(QString, question);
+    const auto pairs = partsOfOneHash(entry);
+    QVERIFY(!pairs.isEmpty());
+
+    for (const auto &pair : pairs) {
+        PopupInterruptionStore store;
+        store.insertInterruptionBehavior(PopupState::Prohibit, entry.arg(pair.first), "called");
+        store.insertInterruptionBehavior(PopupState::AllowStack, "shown", entry.arg(pair.first));
+
+        QCOMPARE(store.getInterruptionBehavior(question.arg(pair.first), "called"),
+                 PopupState::Prohibit);
+        QCOMPARE(store.getInterruptionBehavior(question.arg(pair.second), "called"),
+                 PopupState::Allow);
+        QCOMPARE(store.getInterruptionBehavior("shown", question.arg(pair.first)),
+                 PopupState::AllowStack);
+        QCOMPARE(store.getInterruptionBehavior("shown", question.arg(pair.second)),
+                 PopupState::Allow);
+    }
+}
+
 void tst_InterruptionLookup::namesThatDifferInOneCharacterSpreadOverTheTable_data()
 {
     QTest::addColumn<QString>("before");
@@ -319,6 +378,41 @@ void tst_InterruptionLookup::namesThatDifferInOneCharacterSpreadOverTheTable()
     QVERIFY2(hashes.size() >= count - 2, qPrintable(QString::number(hashes.size())));
     const int fullest = *std::max_element(fill.cbegin(), fill.cend());
     QVERIFY2(fullest <= 12, qPrintable(QString::number(fullest)));
+}
+
+void tst_InterruptionLookup::namesThatDifferInEveryFourthCharacterHaveHashesOfTheirOwn_data()
+{
+    QTest::addColumn<int>("first");
+
+    QTest::newRow("from the first on") << 0;
+    QTest::newRow("from the second on") << 1;
+    QTest::newRow("from the third on") << 2;
+    QTest::newRow("from the fourth on") << 3;
+}
+
+// Four characters are hashed at once: differences in the same place of each may not cancel out.
+void tst_InterruptionLookup::namesThatDifferInEveryFourthCharacterHaveHashesOfTheirOwn()
+{
+    QFETCH(int, first);
+    const QString letters = "ABCDEFGHIJKLMNOPQRSTUVW";
+    QString name = "the traffic news";
+    QSet<uint> hashes;
+    int count = 0;
+
+    for (const QChar one : letters) {
+        for (const QChar two : letters) {
+            for (const QChar three : letters) {
+                name[first] = one;
+                name[first + 4] = two;
+                name[first + 8] = three;
+                hashes.insert(qHash(RuleName(name)));
+                ++count;
+            }
+        }
+    }
+
+    QCOMPARE(count, 12167);
+    QVERIFY2(hashes.size() >= count - 2, qPrintable(QString::number(hashes.size())));
 }
 
 QTEST_GUILESS_MAIN(tst_InterruptionLookup)
