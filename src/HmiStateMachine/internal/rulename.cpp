@@ -94,8 +94,11 @@ const QChar *findSeparator(const QChar *at, const QChar *end)
 
 bool equal(QStringView a, QStringView b)
 {
+    // The rest of a wildcard may be empty, and its data null then, which memcmp() may not be given.
     return a.size() == b.size()
-        && std::memcmp(a.data(), b.data(), static_cast<std::size_t>(a.size()) * sizeof(QChar)) == 0;
+        && (a.isEmpty()
+            || std::memcmp(a.data(), b.data(), static_cast<std::size_t>(a.size()) * sizeof(QChar))
+                == 0);
 }
 
 } // namespace
