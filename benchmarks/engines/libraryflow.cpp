@@ -1,7 +1,5 @@
 #include "libraryflow.h"
 
-#include "viewsetup.h"
-
 #include <HmiStateMachine/hmi/hmiviewstate.h>
 #include <HmiStateMachine/named/hmibackevent.h>
 #include <HmiStateMachine/named/hmiviewevent.h>
@@ -89,7 +87,6 @@ void ShapeFlow::buildViews(const FlowShape &shape)
     const QStringList names = shape.viewNames();
     for (int i = 0; i < names.size(); ++i) {
         auto *view = new HmiViewState(m_screenIds.at(i), names.at(i), m_viewParent);
-        addInstanceData(view);
         if (shape.back) {
             view->setHandlesBackEvent(true);
         }

@@ -1,17 +1,6 @@
 #include "plainview.h"
 
 #include "viewlayer.h"
-#include "viewsetup.h"
-
-PlainView::PlainView(const QString &screen) : m_screen(screen)
-{
-    ::addInstanceData(this);
-}
-
-void PlainView::addInstanceData(const QString &key, const QVariant &value)
-{
-    m_instanceData.insert(key, value);
-}
 
 void PlainView::enter(ViewLayer &layer, const QVariant &data)
 {

@@ -10,9 +10,7 @@ class ViewLayer;
 class PlainView
 {
 public:
-    explicit PlainView(const QString &screen);
-
-    void addInstanceData(const QString &key, const QVariant &value);
+    explicit PlainView(const QString &screen) : m_screen(screen) { }
 
     void enter(ViewLayer &layer, const QVariant &data);
     void leave(ViewLayer &layer);

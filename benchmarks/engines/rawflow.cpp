@@ -3,8 +3,6 @@
 #include "rawevents.h"
 #include "rawkey.h"
 
-#include "viewsetup.h"
-
 namespace Raw {
 
 namespace {
@@ -90,7 +88,6 @@ void ShapeFlow::buildViews(const FlowShape &shape)
     const QStringList names = shape.viewNames();
     for (int i = 0; i < names.size(); ++i) {
         auto *view = new View(m_screens, names.at(i), m_screenIds.at(i), m_viewParent);
-        addInstanceData(view);
         if (shape.back) {
             view->handleBack();
         }

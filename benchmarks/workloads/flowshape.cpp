@@ -14,12 +14,6 @@ QStringList numbered(const QString &prefix, int count)
 
 } // namespace
 
-QString FlowShape::instanceKey(int number)
-{
-    static const QStringList keys = numbered(QStringLiteral("key"), instanceKeys);
-    return keys.at(number);
-}
-
 QStringList FlowShape::viewNames() const
 {
     return numbered(QStringLiteral("View"), views);

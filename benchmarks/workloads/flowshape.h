@@ -26,10 +26,6 @@ struct FlowShape
     /** Every view leads back to where it was entered from. */
     bool back = false;
 
-    /** Values that the application hands to the view layer with every view. */
-    static constexpr int instanceKeys = 3;
-
-    static QString instanceKey(int number);
     QStringList viewNames() const;
     QStringList screens() const;
     QStringList popupNames() const;

@@ -4,14 +4,23 @@
 #include "rawkey.h"
 #include "rawview.h"
 #include "sides.h"
-#include "viewsetup.h"
 
 #include <HmiStateMachine/hmi/hmiviewstate.h>
 #include <HmiStateMachine/named/keysignaltransition.h>
 
 namespace {
 
-// Every view is one as flows have them: with instance data, and with a way back.
+// Every view is one as flows have them: with instance data of the application, and a way back.
+constexpr int instanceKeys = 3;
+
+template <typename View> void addInstanceData(View *view)
+{
+    static const QString keys[instanceKeys] = {QStringLiteral("title"), QStringLiteral("source"),
+                                               QStringLiteral("position")};
+    for (int key = 0; key < instanceKeys; ++key) {
+        view->addInstanceData(keys[key], key);
+    }
+}
 
 enum class Phase { Build, Start, Destroy };
 
