@@ -71,6 +71,11 @@ const SlotConnection &triggeredConnection()
 // False for what is no number, such as a text that cannot be read as one.
 bool readInt(const QVariant &argument, int *value)
 {
+    // The usual type is read as it is: each key transition of an active state reads two numbers.
+    if (argument.userType() == QMetaType::Int) {
+        *value = *static_cast<const int *>(argument.constData());
+        return true;
+    }
     bool isNumber = false;
     *value = argument.toInt(&isNumber);
     return isNumber;
