@@ -37,12 +37,12 @@ HmiSignalTransition::~HmiSignalTransition()
 
 bool HmiSignalTransition::blocked() const
 {
-    return m_blocked;
+    return isBlocked();
 }
 
 void HmiSignalTransition::setBlocked(bool blocked)
 {
-    m_blocked = blocked;
+    block(blocked);
 }
 
 bool HmiSignalTransition::makeParallelExclusive(int priority)
@@ -56,7 +56,7 @@ bool HmiSignalTransition::makeParallelExclusive(int priority)
 bool HmiSignalTransition::eventTest(QEvent *event)
 {
     // Short: Qt asks every transition of an active state three times for every event.
-    return !m_blocked && internalEventTest(event) && takeSignal(event);
+    return !isBlocked() && internalEventTest(event) && takeSignal(event);
 }
 
 void HmiSignalTransition::onTransition(QEvent *event)

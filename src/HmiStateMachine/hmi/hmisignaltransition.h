@@ -70,7 +70,6 @@ private:
     void forgetSender();
 
     QList<QVariant> m_triggerArguments;
-    bool m_blocked = false;
     QMetaObject::Connection m_senderDestroyed;
 };
 

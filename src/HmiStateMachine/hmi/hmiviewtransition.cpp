@@ -13,17 +13,17 @@ HmiViewTransition::~HmiViewTransition() = default;
 
 void HmiViewTransition::setBlocked(bool blocked)
 {
-    m_blocked = blocked;
+    block(blocked);
 }
 
 bool HmiViewTransition::blocked() const
 {
-    return m_blocked;
+    return isBlocked();
 }
 
 bool HmiViewTransition::eventTest(QEvent *event)
 {
-    if (m_blocked || event->type() != HmiViewEvent::eventType()) {
+    if (isBlocked() || event->type() != HmiViewEvent::eventType()) {
         return false;
     }
     const QString viewId = static_cast<HmiViewEvent *>(event)->viewId();

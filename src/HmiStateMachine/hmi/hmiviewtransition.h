@@ -38,8 +38,6 @@ public:
 
 private:
     Q_DISABLE_COPY(HmiViewTransition)
-
-    bool m_blocked = false;
 };
 
 } // namespace HmiStateMachine

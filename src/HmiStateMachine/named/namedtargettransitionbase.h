@@ -79,6 +79,10 @@ protected:
     /** The common end of a firing: off the list, then the voice request is passed on. */
     void finishTransition();
 
+    /** For the classes that can be blocked; kept here, where it takes no room of its own. */
+    bool isBlocked() const { return m_blocked; }
+    void block(bool blocked) { m_blocked = blocked; }
+
 private:
     Q_DISABLE_COPY(NamedTargetTransitionBase)
 
@@ -88,7 +92,8 @@ private:
 
     QVector<QPointer<ParallelSiblingTransitionGroup>> m_siblingGroups;
     bool m_isVREvent = false;
-    bool m_warnedOfMissingTarget = false; // here, where it takes no room of its own
+    bool m_warnedOfMissingTarget = false;
+    bool m_blocked = false;
     QVariant m_vrEventData;
 };
 
