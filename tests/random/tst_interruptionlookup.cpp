@@ -253,6 +253,8 @@ private Q_SLOTS:
     void theWildCardsOfANameAreItsParts();
     void namesOfOneHashAreToldApart_data();
     void namesOfOneHashAreToldApart();
+    void aNameWithTheHashOfAWildCardIsNone_data();
+    void aNameWithTheHashOfAWildCardIsNone();
     void namesThatDifferInOneCharacterSpreadOverTheTable_data();
     void namesThatDifferInOneCharacterSpreadOverTheTable();
     void namesThatDifferInEveryFourthCharacterHaveHashesOfTheirOwn_data();
@@ -335,6 +337,38 @@ void tst_InterruptionLookup::namesOfOneHashAreToldApart()
         QCOMPARE(store.getInterruptionBehavior("shown", question.arg(pair.second)),
                  PopupState::Allow);
     }
+}
+
+// Found by trial: these have the hash of the wildcard, and its fixed part in the same place.
+// Another hash, or another order of bytes, needs others.
+void tst_InterruptionLookup::aNameWithTheHashOfAWildCardIsNone_data()
+{
+    QTest::addColumn<QString>("name");
+    QTest::addColumn<QString>("wildCard");
+    QTest::addColumn<QString>("question");
+
+    QTest::newRow("a popup of any module") << "pqakziop"
+                                           << "*/akziop"
+                                           << "module/akziop";
+    QTest::newRow("any popup of a module") << "aulamyfo"
+                                           << "aulamy/*"
+                                           << "aulamy/popup";
+}
+
+void tst_InterruptionLookup::aNameWithTheHashOfAWildCardIsNone()
+{
+    QFETCH(QString, name);
+    QFETCH(QString, wildCard);
+    QFETCH(QString, question);
+    PopupInterruptionStore store;
+    QCOMPARE(qHash(RuleName(name)), qHash(RuleName(wildCard)));
+
+    store.insertInterruptionBehavior(PopupState::Prohibit, name, "called");
+    QCOMPARE(store.getInterruptionBehavior(question, "called"), PopupState::Allow);
+
+    store.insertInterruptionBehavior(PopupState::AllowStack, wildCard, "called");
+    QCOMPARE(store.getInterruptionBehavior(question, "called"), PopupState::AllowStack);
+    QCOMPARE(store.getInterruptionBehavior(name, "called"), PopupState::Prohibit);
 }
 
 void tst_InterruptionLookup::namesThatDifferInOneCharacterSpreadOverTheTable_data()
