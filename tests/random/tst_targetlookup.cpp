@@ -60,6 +60,27 @@ PopupState *walkToPopup(const QString &id)
     return firstWith(id, &PopupState::popupViewId);
 }
 
+// The first answer after a change comes from a walk, and the next one from an index.
+template <typename State> State *bothAnswers(State *first, State *second, const QString &id)
+{
+    if (first != second) {
+        qFatal("\"%s\" finds one state first and another one then", qPrintable(id));
+    }
+    return first;
+}
+
+HmiViewState *viewFor(const QString &id)
+{
+    HmiViewState *const first = HmiViewState::stateForTarget(id);
+    return bothAnswers(first, HmiViewState::stateForTarget(id), id);
+}
+
+PopupState *popupFor(const QString &id)
+{
+    PopupState *const first = PopupState::stateForTarget(id);
+    return bothAnswers(first, PopupState::stateForTarget(id), id);
+}
+
 QString text(const NamedState *state)
 {
     return state ? state->metaObject()->className() + QString(" named \"%1\"").arg(state->name())
@@ -95,9 +116,8 @@ public:
     {
         for (int count = m_random.below(5); count > 0; --count) {
             const QString id = m_random.oneIn(3) ? anyId() : targetId();
-            const QString wrong =
-                compared("view", id, HmiViewState::stateForTarget(id), walkToView(id))
-                + compared("popup", id, PopupState::stateForTarget(id), walkToPopup(id));
+            const QString wrong = compared("view", id, viewFor(id), walkToView(id))
+                + compared("popup", id, popupFor(id), walkToPopup(id));
             if (!wrong.isEmpty()) {
                 return wrong;
             }
@@ -296,7 +316,7 @@ void tst_TargetLookup::theRegistrysOrderDecidesBetweenViewsOfOneTarget()
 
     for (int number = 0; number < 500; ++number) {
         states.push_back(std::make_unique<NamedState>("Other" + QString::number(number)));
-        HmiViewState *const view = HmiViewState::stateForTarget("Map");
+        HmiViewState *const view = viewFor("Map");
         QCOMPARE(view, firstWith("Map", &HmiViewState::targetView));
         found.insert(view);
     }
@@ -314,7 +334,7 @@ void tst_TargetLookup::theRegistrysOrderDecidesBetweenPopupsOfOneViewId()
 
     for (int number = 0; number < 500; ++number) {
         states.push_back(std::make_unique<NamedState>("Other" + QString::number(number)));
-        PopupState *const popup = PopupState::stateForTarget("Call");
+        PopupState *const popup = popupFor("Call");
         QCOMPARE(popup, firstWith("Call", &PopupState::popupViewId));
         found.insert(popup);
     }
@@ -326,18 +346,18 @@ void tst_TargetLookup::aNameGoesBeforeATarget()
 {
     HmiViewState shown("Map", "Shown");
     auto popup = popupShownAs("Call", "Phone");
-    QCOMPARE(HmiViewState::stateForTarget("Map"), &shown);
-    QCOMPARE(PopupState::stateForTarget("Call"), popup.get());
+    QCOMPARE(viewFor("Map"), &shown);
+    QCOMPARE(popupFor("Call"), popup.get());
 
     HmiViewState named("Radio", "Map");
     auto namedPopup = popupShownAs("Fuel", "Call");
 
-    QCOMPARE(HmiViewState::stateForTarget("Map"), &named);
-    QCOMPARE(PopupState::stateForTarget("Call"), namedPopup.get());
+    QCOMPARE(viewFor("Map"), &named);
+    QCOMPARE(popupFor("Call"), namedPopup.get());
     named.setName("Elsewhere");
     namedPopup->setName("Another");
-    QCOMPARE(HmiViewState::stateForTarget("Map"), &shown);
-    QCOMPARE(PopupState::stateForTarget("Call"), popup.get());
+    QCOMPARE(viewFor("Map"), &shown);
+    QCOMPARE(popupFor("Call"), popup.get());
 }
 
 void tst_TargetLookup::anotherKindOfStateOfThatNameHidesNoTarget()
@@ -346,75 +366,75 @@ void tst_TargetLookup::anotherKindOfStateOfThatNameHidesNoTarget()
     const auto popup = popupShownAs("Map", "Phone");
     const NamedState plain("Map");
 
-    QCOMPARE(HmiViewState::stateForTarget("Map"), &shown);
-    QCOMPARE(PopupState::stateForTarget("Map"), popup.get());
+    QCOMPARE(viewFor("Map"), &shown);
+    QCOMPARE(popupFor("Map"), popup.get());
 }
 
 void tst_TargetLookup::anEmptyTargetFindsNoView()
 {
     const HmiViewState dummy(QString(), "Dummy");
 
-    QCOMPARE(HmiViewState::stateForTarget(QString()), nullptr);
-    QCOMPARE(HmiViewState::stateForTarget(""), nullptr);
+    QCOMPARE(viewFor(QString()), nullptr);
+    QCOMPARE(viewFor(""), nullptr);
 }
 
 void tst_TargetLookup::anEmptyViewIdFindsThePopupThatHasIt()
 {
     const auto call = popupShownAs("Call", "Phone");
-    QCOMPARE(PopupState::stateForTarget(QString()), nullptr);
+    QCOMPARE(popupFor(QString()), nullptr);
 
     const auto hidden = popupShownAs("", "Hidden");
 
-    QCOMPARE(PopupState::stateForTarget(QString()), hidden.get());
-    QCOMPARE(PopupState::stateForTarget(""), hidden.get());
+    QCOMPARE(popupFor(QString()), hidden.get());
+    QCOMPARE(popupFor(""), hidden.get());
 }
 
 void tst_TargetLookup::aRenamedStateIsFoundByItsTarget()
 {
     HmiViewState view("Map", "First");
     const auto popup = popupShownAs("Call", "Phone");
-    QCOMPARE(HmiViewState::stateForTarget("Map"), &view);
-    QCOMPARE(PopupState::stateForTarget("Call"), popup.get());
+    QCOMPARE(viewFor("Map"), &view);
+    QCOMPARE(popupFor("Call"), popup.get());
 
     view.setName("Second");
     popup->setName("Telephone");
 
-    QCOMPARE(HmiViewState::stateForTarget("Map"), &view);
-    QCOMPARE(HmiViewState::stateForTarget("First"), nullptr);
-    QCOMPARE(HmiViewState::stateForTarget("Second"), &view);
-    QCOMPARE(PopupState::stateForTarget("Call"), popup.get());
-    QCOMPARE(PopupState::stateForTarget("Phone"), nullptr);
-    QCOMPARE(PopupState::stateForTarget("Telephone"), popup.get());
+    QCOMPARE(viewFor("Map"), &view);
+    QCOMPARE(viewFor("First"), nullptr);
+    QCOMPARE(viewFor("Second"), &view);
+    QCOMPARE(popupFor("Call"), popup.get());
+    QCOMPARE(popupFor("Phone"), nullptr);
+    QCOMPARE(popupFor("Telephone"), popup.get());
 }
 
 void tst_TargetLookup::aStateWithoutANameIsNotFound()
 {
     HmiViewState view("Map", "View");
     const auto popup = popupShownAs("Call", "Phone");
-    QCOMPARE(HmiViewState::stateForTarget("Map"), &view);
-    QCOMPARE(PopupState::stateForTarget("Call"), popup.get());
+    QCOMPARE(viewFor("Map"), &view);
+    QCOMPARE(popupFor("Call"), popup.get());
 
     view.setName(QString());
     popup->setName(QString());
 
-    QCOMPARE(HmiViewState::stateForTarget("Map"), nullptr);
-    QCOMPARE(PopupState::stateForTarget("Call"), nullptr);
+    QCOMPARE(viewFor("Map"), nullptr);
+    QCOMPARE(popupFor("Call"), nullptr);
 }
 
 void tst_TargetLookup::aStateOfAnUnregisteredNameIsNotFound()
 {
     HmiViewState view("Map", "View");
     const auto popup = popupShownAs("Call", "Phone");
-    QCOMPARE(HmiViewState::stateForTarget("Map"), &view);
-    QCOMPARE(PopupState::stateForTarget("Call"), popup.get());
+    QCOMPARE(viewFor("Map"), &view);
+    QCOMPARE(popupFor("Call"), popup.get());
 
     view.setNameNonHashing("Shared");
     popup->setNameNonHashing("Shared");
 
-    QCOMPARE(HmiViewState::stateForTarget("Map"), nullptr);
-    QCOMPARE(HmiViewState::stateForTarget("Shared"), nullptr);
-    QCOMPARE(PopupState::stateForTarget("Call"), nullptr);
-    QCOMPARE(PopupState::stateForTarget("Shared"), nullptr);
+    QCOMPARE(viewFor("Map"), nullptr);
+    QCOMPARE(viewFor("Shared"), nullptr);
+    QCOMPARE(popupFor("Call"), nullptr);
+    QCOMPARE(popupFor("Shared"), nullptr);
 }
 
 void tst_TargetLookup::aStateThatLostItsNameIsNotFoundUntilItTakesAnother()
@@ -424,19 +444,19 @@ void tst_TargetLookup::aStateThatLostItsNameIsNotFoundUntilItTakesAnother()
     PopupState popup("Taken", 1);
     popup.setPopupViewId("Call");
     QCOMPARE(messages().take().size(), 2);
-    QCOMPARE(HmiViewState::stateForTarget("Map"), nullptr);
-    QCOMPARE(PopupState::stateForTarget("Call"), nullptr);
+    QCOMPARE(viewFor("Map"), nullptr);
+    QCOMPARE(popupFor("Call"), nullptr);
 
     view.setName("View");
     popup.setName("Popup");
 
-    QCOMPARE(HmiViewState::stateForTarget("Map"), &view);
-    QCOMPARE(PopupState::stateForTarget("Call"), &popup);
+    QCOMPARE(viewFor("Map"), &view);
+    QCOMPARE(popupFor("Call"), &popup);
     view.setName("Taken");
     popup.setName("Taken");
     QCOMPARE(messages().take().size(), 2);
-    QCOMPARE(HmiViewState::stateForTarget("Map"), nullptr);
-    QCOMPARE(PopupState::stateForTarget("Call"), nullptr);
+    QCOMPARE(viewFor("Map"), nullptr);
+    QCOMPARE(popupFor("Call"), nullptr);
 }
 
 void tst_TargetLookup::aDestroyedStateLeavesItsTargetToTheNext()
@@ -448,27 +468,24 @@ void tst_TargetLookup::aDestroyedStateLeavesItsTargetToTheNext()
     }
 
     while (!states.empty()) {
-        QVERIFY(HmiViewState::stateForTarget("Map") || PopupState::stateForTarget("Call"));
-        QCOMPARE(HmiViewState::stateForTarget("Map"), firstWith("Map", &HmiViewState::targetView));
-        QCOMPARE(PopupState::stateForTarget("Call"), firstWith("Call", &PopupState::popupViewId));
+        QVERIFY(viewFor("Map") || popupFor("Call"));
+        QCOMPARE(viewFor("Map"), firstWith("Map", &HmiViewState::targetView));
+        QCOMPARE(popupFor("Call"), firstWith("Call", &PopupState::popupViewId));
         states.erase(states.begin());
     }
 
-    QCOMPARE(HmiViewState::stateForTarget("Map"), nullptr);
-    QCOMPARE(PopupState::stateForTarget("Call"), nullptr);
+    QCOMPARE(viewFor("Map"), nullptr);
+    QCOMPARE(popupFor("Call"), nullptr);
 }
 
 void tst_TargetLookup::aStateIsNotFoundOnItsDestruction()
 {
     auto view = std::make_unique<HmiViewState>("Map", "View");
     auto popup = popupShownAs("Call", "Phone");
-    QVector<const NamedState *> found = {HmiViewState::stateForTarget("Map"),
-                                         PopupState::stateForTarget("Call")};
+    QVector<const NamedState *> found = {viewFor("Map"), popupFor("Call")};
     QCOMPARE(found, QVector<const NamedState *>({view.get(), popup.get()}));
-    connect(view.get(), &QObject::destroyed, this,
-            [&found] { found[0] = HmiViewState::stateForTarget("Map"); });
-    connect(popup.get(), &QObject::destroyed, this,
-            [&found] { found[1] = PopupState::stateForTarget("Call"); });
+    connect(view.get(), &QObject::destroyed, this, [&found] { found[0] = viewFor("Map"); });
+    connect(popup.get(), &QObject::destroyed, this, [&found] { found[1] = popupFor("Call"); });
 
     view.reset();
     popup.reset();
@@ -481,44 +498,44 @@ void tst_TargetLookup::aStateRegisteredByHandIsFoundUntilThatNameIsFreed()
     HmiViewState view("Map", QString());
     PopupState popup(QString(), 1);
     popup.setPopupViewId("Call");
-    QCOMPARE(HmiViewState::stateForTarget("Map"), nullptr);
-    QCOMPARE(PopupState::stateForTarget("Call"), nullptr);
+    QCOMPARE(viewFor("Map"), nullptr);
+    QCOMPARE(popupFor("Call"), nullptr);
 
     QVERIFY(NamedState::hash("ForeignView", &view));
     QVERIFY(NamedState::hash("ForeignPopup", &popup));
 
-    QCOMPARE(HmiViewState::stateForTarget("Map"), &view);
-    QCOMPARE(PopupState::stateForTarget("Call"), &popup);
+    QCOMPARE(viewFor("Map"), &view);
+    QCOMPARE(popupFor("Call"), &popup);
     NamedState::removeFromHash("ForeignView");
     NamedState::removeFromHash("ForeignPopup");
-    QCOMPARE(HmiViewState::stateForTarget("Map"), nullptr);
-    QCOMPARE(PopupState::stateForTarget("Call"), nullptr);
+    QCOMPARE(viewFor("Map"), nullptr);
+    QCOMPARE(popupFor("Call"), nullptr);
 }
 
 void tst_TargetLookup::anotherPopupViewIdHoldsFromThenOn()
 {
     PopupState popup("Phone", 1);
-    QCOMPARE(PopupState::stateForTarget("Call"), nullptr);
+    QCOMPARE(popupFor("Call"), nullptr);
 
     popup.setPopupViewId("Call");
-    QCOMPARE(PopupState::stateForTarget("Call"), &popup);
+    QCOMPARE(popupFor("Call"), &popup);
 
     popup.setPopupViewId("Ring");
-    QCOMPARE(PopupState::stateForTarget("Call"), nullptr);
-    QCOMPARE(PopupState::stateForTarget("Ring"), &popup);
-    QCOMPARE(PopupState::stateForTarget("Phone"), &popup);
+    QCOMPARE(popupFor("Call"), nullptr);
+    QCOMPARE(popupFor("Ring"), &popup);
+    QCOMPARE(popupFor("Phone"), &popup);
 }
 
 void tst_TargetLookup::aLookUpBeforeAnyStateHidesNone()
 {
-    QCOMPARE(HmiViewState::stateForTarget("Map"), nullptr);
-    QCOMPARE(PopupState::stateForTarget("Call"), nullptr);
+    QCOMPARE(viewFor("Map"), nullptr);
+    QCOMPARE(popupFor("Call"), nullptr);
 
     const HmiViewState view("Map", "View");
     const auto popup = popupShownAs("Call", "Phone");
 
-    QCOMPARE(HmiViewState::stateForTarget("Map"), &view);
-    QCOMPARE(PopupState::stateForTarget("Call"), popup.get());
+    QCOMPARE(viewFor("Map"), &view);
+    QCOMPARE(popupFor("Call"), popup.get());
 }
 
 void tst_TargetLookup::aLookUpWhileAViewIsMadeDoesNotHideIt()
@@ -527,14 +544,14 @@ void tst_TargetLookup::aLookUpWhileAViewIsMadeDoesNotHideIt()
     QVector<const NamedState *> found;
     const ChildWatch watch(&parent, [&found](QObject *) {
         found.append(NamedState::stateForName("View"));
-        found.append(HmiViewState::stateForTarget("Map"));
+        found.append(viewFor("Map"));
     });
 
     const auto *view = new HmiViewState("Map", "View", &parent);
 
     // It has its name by then, but is no view yet.
     QCOMPARE(found, QVector<const NamedState *>({view, nullptr}));
-    QCOMPARE(HmiViewState::stateForTarget("Map"), view);
+    QCOMPARE(viewFor("Map"), view);
 }
 
 // Under its own name a popup is found in any case, so this one is given another meanwhile.
@@ -547,14 +564,14 @@ void tst_TargetLookup::aLookUpWhileAPopupIsMadeDoesNotHideIt()
             NamedState *const named = NamedState::stateForName("Phone");
             NamedState::removeFromHash("Phone");
             QVERIFY(NamedState::hash("Foreign", named));
-            found = {named, PopupState::stateForTarget("Phone")};
+            found = {named, popupFor("Phone")};
         });
     });
 
     auto *popup = new PopupState("Phone", &root, 1);
 
     QCOMPARE(found, QVector<const NamedState *>({popup, nullptr}));
-    QCOMPARE(PopupState::stateForTarget("Phone"), popup);
+    QCOMPARE(popupFor("Phone"), popup);
     NamedState::removeFromHash("Foreign");
 }
 
