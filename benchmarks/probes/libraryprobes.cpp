@@ -41,6 +41,33 @@ private:
     int m_next = 0;
 };
 
+FlowShape viewsByScreen(int views)
+{
+    FlowShape shape;
+    shape.views = views;
+    shape.byScreen = true;
+    return shape;
+}
+
+/** A state comes to be and goes before each request for a view by its screen. */
+class ChangingFlow : public Library::ShapeFlow
+{
+public:
+    explicit ChangingFlow(int views) : ShapeFlow(viewsByScreen(views)) { }
+
+    void run(int operations) override
+    {
+        for (int i = 0; i < operations; ++i) {
+            const NamedState state(QStringLiteral("Passing"));
+            m_next = 1 - m_next;
+            requestView(screens().at(m_next), i);
+        }
+    }
+
+private:
+    int m_next = 0;
+};
+
 /** Every view that is left and entered is watched by other states. */
 class Monitored : public ViewRequests
 {
@@ -138,6 +165,10 @@ QVector<Workload> libraryProbes()
     return probes<Monitored>(engine, QStringLiteral("P-monitors"),
                              QStringLiteral("view switch, %1 monitors on each view"), oneLayout,
                              {0, 10, 100})
+        + probes<ChangingFlow>(engine, QStringLiteral("P-screen-ids"),
+                               QStringLiteral("view switch by a screen id after a state has come "
+                                              "and gone, %1 views"),
+                               oneLayout, {10, 100, 1000})
         + probes<WildcardLookup>(engine, QStringLiteral("P-wildcards"),
                                  QStringLiteral("interruption lookup among %1 wildcards"),
                                  oneLayout, {10, 100, 1000})
