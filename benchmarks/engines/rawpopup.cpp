@@ -161,7 +161,13 @@ void Popup::show()
 {
     m_popups->layer().requestPopupShow(m_name, m_kind, m_instanceData);
     m_popups->layer().unstackPopup(m_name);
-    qCWarning(popups) << "Popup shown:" << m_name;
+    // What qCWarning() is made of, which Clang takes for an extension of GCC's.
+    if (popups().isWarningEnabled()) {
+        QMessageLogger(QT_MESSAGELOG_FILE, QT_MESSAGELOG_LINE, QT_MESSAGELOG_FUNC,
+                       popups().categoryName())
+                .warning()
+            << "Popup shown:" << m_name;
+    }
 }
 
 void Popup::hide()
