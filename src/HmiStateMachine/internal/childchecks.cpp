@@ -31,7 +31,8 @@ ChildChecks::~ChildChecks()
 
 void ChildChecks::add(NamedState *state)
 {
-    if (m_states.isEmpty()) {
+    if (!m_posted) {
+        m_posted = true;
         QMetaObject::invokeMethod(
             this, [this] { run(); }, Qt::QueuedConnection);
     }
@@ -45,11 +46,16 @@ void ChildChecks::remove(NamedState *state)
     if (m_states.value(place) == state) {
         m_states[place] = nullptr;
     }
+    // States that come and go before the event loop runs must not leave a place each.
+    while (!m_states.isEmpty() && !m_states.last()) {
+        m_states.removeLast();
+    }
     state->m_childCheckPlace = NamedState::noPlace;
 }
 
 void ChildChecks::run()
 {
+    m_posted = false;
     QVector<NamedState *> states;
     states.swap(m_states);
     for (NamedState *state : qAsConst(states)) {

@@ -34,6 +34,7 @@ private:
     void run();
 
     QVector<NamedState *> m_states; // null where one has been taken away
+    bool m_posted = false;
 };
 
 } // namespace HmiStateMachine

@@ -107,7 +107,7 @@ NamedState::~NamedState()
     for (const NamedState *monitor : qAsConst(m_monitoringStates)) {
         disconnect(monitor, &QObject::destroyed, this, &NamedState::forgetMonitor);
     }
-    // Required: frees the entry of that name whichever state holds it.
+    // By the name alone: the entry goes whichever state holds it.
     removeFromHash(m_name);
 }
 

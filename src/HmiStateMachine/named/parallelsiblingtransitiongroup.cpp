@@ -49,7 +49,7 @@ bool ParallelSiblingTransitionGroup::addTransition(NamedTargetTransitionBase *tr
         m_takenPriorities.insert(priority);
         trackSource(transition, source);
     }
-    // Required: without a source state too, so that the transition knows of the group all the same.
+    // Without a source state too, so that the transition knows of the group all the same.
     transition->m_siblingGroups.append(this);
     return true;
 }
