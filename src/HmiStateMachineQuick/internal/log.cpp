@@ -1,0 +1,7 @@
+#include <HmiStateMachineQuick/internal/log.h>
+
+namespace HmiStateMachine {
+
+Q_LOGGING_CATEGORY(hmistatemachinequick, "hmistatemachine.quick")
+
+} // namespace HmiStateMachine
