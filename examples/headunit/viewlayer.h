@@ -1,21 +1,16 @@
 #pragma once
 
-#include "popupboard.h"
-
-#include <HmiStateMachine/named/viewstatetarget.h>
+#include <HmiStateMachineQuick/quickviewstatetarget.h>
 
 namespace headunit {
 
 class Transcript;
 
 /**
- * The view layer of the demo: it writes every call into the transcript and reports each view as
- * shown at once, where a real one would take its time for loading and animation.
- *
- * A domain is the part of a view id before the slash. A popup covers those that it has stacked;
- * when it goes, those of another layer are uncovered here, because the flow never left them.
+ * The view layer of the head unit: that of Qt Quick, which also writes every call into the
+ * transcript. Without a scene it reports each view and popup as shown at once.
  */
-class ViewLayer : public HmiStateMachine::ViewStateTarget
+class ViewLayer : public HmiStateMachine::QuickViewStateTarget
 {
     Q_OBJECT
 
@@ -30,9 +25,6 @@ public:
     void requestPopupHide(const QString &popupId, bool deactivated) override;
     void stackPopup(const QString &popupId, const QString &stackingPopupId) override;
     void unstackPopup(const QString &popupId) override;
-    int domainFromName(const QString &domainName) override;
-    int activeDomain() const override;
-    HmiStateMachine::Identifier activeView() const override;
     void retryBlockedPopup(HmiStateMachine::PopupState *popup) override;
     void releaseBlockedPopups(
         const QMap<HmiStateMachine::PopupState *, QTime> &blockedPopups) override;
@@ -44,9 +36,6 @@ public:
 
     static QStringList domainNames();
 
-    /** Another part of the display takes over without a change of view. */
-    void setActiveDomain(const QString &name);
-
     /** The popup that the user sees in front; empty when there is none. */
     QString popupInFront() const;
 
@@ -54,22 +43,25 @@ public:
     void noteRefusal(const QString &popupId);
     bool wasRefused(const QString &popupId) const;
 
-    /** Something that is heard or shown beside the view: the audio source, a hint. */
+    /** Something that is heard or shown beside the view: the audio source, say. */
     void showStatus(const QString &text);
+
+    /** Tells the driver why something was not done. */
+    void showHint(const QString &text);
 
     /** Tells of a voice request that a transition has passed on, and forgets it. */
     void takeVoiceRequest();
 
+Q_SIGNALS:
+    void hintShown(const QString &text);
+
 private:
     Q_DISABLE_COPY(ViewLayer)
 
-    void setActiveView(const QString &viewId);
     void showTimeLeft(const QVariant &popupData);
 
     Transcript &m_transcript;
-    PopupBoard m_popups;
-    QString m_activeView;
-    int m_activeDomain = -1;
+    QStringList m_refused;
 };
 
 } // namespace headunit

@@ -52,7 +52,7 @@ void openVideoOnlyWhenStanding(const Vehicle *vehicle, ViewLayer *viewLayer)
     HmiTransition *show = onEvent("ShowVideo", state("Media/Player"), "Media/Video");
     allowOnlyWhile([vehicle] { return vehicle->speed() <= walkingPace; }, show);
     QObject::connect(show, &GuardedTransition::testFailed, viewLayer,
-                     [viewLayer] { viewLayer->showStatus("no video while driving"); });
+                     [viewLayer] { viewLayer->showHint("no video while driving"); });
 }
 
 // A guarded property transition denies unless its guard allows.

@@ -32,7 +32,7 @@ void typeOnlyWhenStanding(const Vehicle *vehicle, ViewLayer *viewLayer)
         onEvent("SearchDestination", state("Navigation/Map"), "Navigation/Destination");
     allowOnlyWhile([vehicle] { return vehicle->speed() <= walkingPace; }, search);
     QObject::connect(search, &GuardedTransition::testFailed, viewLayer,
-                     [viewLayer] { viewLayer->showStatus("no typing while driving"); });
+                     [viewLayer] { viewLayer->showHint("no typing while driving"); });
 }
 
 void planRoute()

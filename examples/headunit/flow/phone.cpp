@@ -66,7 +66,7 @@ void dialContacts(const Vehicle *vehicle, ViewLayer *viewLayer)
     HmiTransition *dial = onEvent("Dial", state("Phone/ContactDetails"), "Phone/InCall");
     allowOnlyWhile([vehicle] { return vehicle->phoneConnected(); }, dial);
     QObject::connect(dial, &GuardedTransition::testFailed, viewLayer,
-                     [viewLayer] { viewLayer->showStatus("no phone connected"); });
+                     [viewLayer] { viewLayer->showHint("no phone connected"); });
 }
 
 // Without a phone there are no favourites: however they are asked for, the devices are shown in

@@ -50,10 +50,9 @@ void tellOf(PopupState *popup, ViewLayer *viewLayer)
     QObject::connect(popup, &PopupState::popupTimeOut, viewLayer, [popup, viewLayer] {
         viewLayer->showStatus("time is up for " + popup->popupViewId());
     });
-    QObject::connect(popup, &PopupState::exitingDueToDriverRestrictions, viewLayer,
-                     [popup, viewLayer] {
-                         viewLayer->showStatus("not while driving: " + popup->popupViewId());
-                     });
+    QObject::connect(
+        popup, &PopupState::exitingDueToDriverRestrictions, viewLayer,
+        [popup, viewLayer] { viewLayer->showHint("not while driving: " + popup->popupViewId()); });
 }
 
 } // namespace

@@ -20,7 +20,7 @@ void updateOnlyWhenParked(const Vehicle *vehicle, ViewLayer *viewLayer)
     HmiTransition *start = onEvent("StartUpdate", state("Settings/Main"), "Settings/Update");
     allowOnlyWhile([vehicle] { return vehicle->gear() == "P"; }, start);
     QObject::connect(start, &GuardedTransition::testFailed, viewLayer,
-                     [viewLayer] { viewLayer->showStatus("updates need gear P"); });
+                     [viewLayer] { viewLayer->showHint("updates need gear P"); });
     onEvent("UpdateDone", state("Settings/Update"), "Settings/Main");
 }
 
