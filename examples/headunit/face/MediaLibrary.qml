@@ -14,8 +14,8 @@ QtObject {
         { title: "Signal & Noise", artist: "Ochre", year: 2016, first: "#f06449", second: "#5b1a2e", pattern: 5 }
     ]
     readonly property var tracks: [
-        { title: "Blue in Green", seconds: 337, album: 2 },
         { title: "Shoreline, 6 a.m.", seconds: 254, album: 0 },
+        { title: "The Long Exit", seconds: 337, album: 2 },
         { title: "Half a Moon", seconds: 221, album: 3 },
         { title: "Antenna Song", seconds: 198, album: 1 },
         { title: "Last Tram Home", seconds: 302, album: 2 },
@@ -34,7 +34,9 @@ QtObject {
     property bool repeat: false
     property real position: 112 ///< seconds
     property string source: "usb"
-    readonly property var currentTrack: root.track(root.currentIndex)
+    property var foreign ///< a track that is not on board, when such a one plays
+    property string told ///< the last title that came from outside
+    readonly property var currentTrack: root.foreign ? root.foreign : root.track(root.currentIndex)
 
     /** A track with all that is to be shown of it. */
     function track(index) {
@@ -44,7 +46,24 @@ QtObject {
                  first: album.first, second: album.second, pattern: album.pattern }
     }
 
+    /** Takes over what the car says is playing; to say the same again changes nothing. */
+    function tell(data) {
+        if (!data || !data.title || data.title === root.told)
+            return
+        root.told = data.title
+        if (data.title === root.currentTrack.title)
+            return
+        var known = root.tracks.findIndex(function(track) { return track.title === data.title })
+        root.select(known >= 0 ? known : root.currentIndex)
+        if (known >= 0)
+            return
+        var album = root.albums[data.title.length % root.albums.length]
+        root.foreign = { title: data.title, seconds: data.seconds || 240, artist: data.artist || album.artist,
+                         album: album.title, first: album.first, second: album.second, pattern: album.pattern }
+    }
+
     function select(index) {
+        root.foreign = undefined
         root.currentIndex = (index + root.tracks.length) % root.tracks.length
         root.position = 0
         root.playing = true

@@ -25,7 +25,7 @@ QtObject {
         { name: "Coral", color: "#ff8a70" },
         { name: "Iris", color: "#a99bff" }
     ]
-    readonly property string clockFormat: root.use24h ? "hh:mm" : "h:mm"
+    readonly property string clockFormat: root.use24h ? "hh:mm" : "h:mm AP"
 
     onAccentChanged: Theme.accent = root.accent
 }
