@@ -14,14 +14,12 @@ MouseArea {
     Rectangle {
         id: tab
 
-        // Its right corners lie outside, where they are cut off.
         anchors.fill: parent
         anchors.leftMargin: 2
-        anchors.rightMargin: 0
         radius: 8
         color: root.pressed ? Theme.pressed : Theme.raised
         border.color: Theme.line
-        opacity: root.open || root.pressed ? 1 : 0.8
+        opacity: root.open || root.pressed ? 1 : 0.6
     }
 
     Icon {

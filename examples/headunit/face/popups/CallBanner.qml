@@ -12,7 +12,7 @@ PopupFrame {
     stateName: "phone/call"
     modal: true
     panelWidth: 760
-    panelHeight: 408
+    panelHeight: 432
 
     CallerPicture {
         id: picture
@@ -24,7 +24,7 @@ PopupFrame {
 
     Column {
         anchors.top: picture.bottom
-        anchors.topMargin: 20
+        anchors.topMargin: 28
         anchors.horizontalCenter: parent.horizontalCenter
         width: parent.width - 96
         spacing: 4

@@ -44,7 +44,7 @@ PopupFrame {
 
     panelWidth: 800
     panelHeight: 112
-    panelY: 16
+    panelY: 8
     surface: Theme.raised
     radius: 28
 

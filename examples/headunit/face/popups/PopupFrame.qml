@@ -22,6 +22,8 @@ Item {
     property color edge: Theme.line
     property int edgeWidth: 1
     property int radius: Theme.radius
+    /** A bar along the left edge; transparent for none. */
+    property color stripe: "transparent"
 
     property alias panelX: panel.x
     property alias panelY: panel.y
@@ -68,6 +70,19 @@ Item {
         // Touches beside the buttons are not meant for the screen beneath.
         MouseArea {
             anchors.fill: parent
+        }
+
+        Item {
+            width: 10
+            height: panel.height
+            clip: true
+
+            Rectangle {
+                width: 2 * root.radius
+                height: panel.height
+                radius: root.radius
+                color: root.stripe
+            }
         }
 
         Item {
