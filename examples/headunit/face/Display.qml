@@ -21,6 +21,13 @@ Rectangle {
         ColorAnimation { duration: 260 }
     }
 
+    // The dark display is one surface: it wakes wherever it is touched.
+    MouseArea {
+        anchors.fill: parent
+        enabled: root.dark
+        onClicked: Requests.view("Home/Main")
+    }
+
     ScreenHost {
         id: screenHost
 
@@ -126,6 +133,7 @@ Rectangle {
     HardKeyBezel {
         id: bezel
 
+        lit: !root.dark
         height: parent.height
     }
 

@@ -5,6 +5,8 @@ import ".."
 Rectangle {
     id: root
 
+    property bool lit: true
+
     readonly property var keys: [
         { key: "Home", icon: "home" },
         { key: "Back", icon: "arrow_back" },
@@ -30,6 +32,11 @@ Rectangle {
 
         anchors.centerIn: parent
         spacing: 24
+        opacity: root.lit ? 1 : 0.45
+
+        Behavior on opacity {
+            NumberAnimation { duration: 260 }
+        }
 
         Repeater {
             model: root.keys

@@ -67,7 +67,7 @@ Item {
         Icon {
             objectName: "status-phone"
             anchors.verticalCenter: parent.verticalCenter
-            name: Vehicle.phoneConnected ? "smartphone" : "phonelink_off"
+            name: Vehicle.phoneConnected ? "smartphone" : "mobile_off"
             size: 28
             color: Vehicle.phoneConnected ? Theme.text : Theme.disabled
         }

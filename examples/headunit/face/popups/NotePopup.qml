@@ -11,7 +11,7 @@ PopupFrame {
             icon: "call_end", ink: Theme.secondary, title: "Call ended", text: root.callTime()
         },
         "phone/lost": {
-            icon: "phonelink_off", ink: Theme.warning, title: "Phone disconnected",
+            icon: "mobile_off", ink: Theme.warning, title: "Phone disconnected",
             text: "Calls and contacts are not available"
         },
         "media/lost": {
@@ -42,7 +42,7 @@ PopupFrame {
         return icons[root.read("source", "usb")] || "music_off";
     }
 
-    panelWidth: 800
+    panelWidth: 760
     panelHeight: 112
     panelY: 8
     surface: Theme.raised

@@ -9,8 +9,6 @@ PopupFrame {
     property string icon: "info"
     property string text: root.read("text", "")
     property bool closable: true
-    /** What is left of the popup's time, from 1 to 0; 0 as well when it stays. */
-    readonly property real timeLeft: root.totalTime > 0 ? Math.max(0, Math.min(1, root.remainingTime / root.totalTime)) : 0
     default property alias details: extra.data
 
     surface: Theme.raised
@@ -56,13 +54,5 @@ PopupFrame {
         icon: "close"
         round: true
         onClicked: root.dismiss()
-    }
-
-    TimeLeftBar {
-        visible: root.totalTime > 0
-        anchors.horizontalCenter: parent.horizontalCenter
-        anchors.bottom: parent.bottom
-        width: parent.width - 2 * root.radius
-        share: root.timeLeft
     }
 }

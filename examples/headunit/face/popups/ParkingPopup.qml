@@ -11,10 +11,10 @@ PopupFrame {
         : root.centimetres < 80 ? Theme.warning : Theme.positive
 
     stripe: root.ink
-    panelWidth: 348
-    panelHeight: 488
+    panelWidth: 320
+    panelHeight: 456
     panelX: root.width - panelWidth - Theme.margin
-    panelY: 104
+    panelY: 148
 
     Label {
         id: title
@@ -43,7 +43,7 @@ PopupFrame {
     ParkingPicture {
         anchors.horizontalCenter: parent.horizontalCenter
         anchors.top: title.bottom
-        anchors.topMargin: 8
+        anchors.topMargin: 0
         centimetres: root.centimetres
         ink: root.ink
     }

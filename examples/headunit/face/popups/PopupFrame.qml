@@ -18,6 +18,10 @@ Item {
     property bool modal: false
     property real scrim: root.modal ? 0.72 : 0
 
+    /** What is left of the popup's time, from 1 to 0; 0 as well when it stays. */
+    readonly property real timeLeft: root.totalTime > 0
+        ? Math.max(0, Math.min(1, root.remainingTime / root.totalTime)) : 0
+
     property color surface: Theme.surface
     property color edge: Theme.line
     property int edgeWidth: 1
@@ -83,6 +87,14 @@ Item {
                 radius: root.radius
                 color: root.stripe
             }
+        }
+
+        TimeLeftBar {
+            anchors.horizontalCenter: parent.horizontalCenter
+            anchors.bottom: parent.bottom
+            width: parent.width - 2 * root.radius
+            visible: root.totalTime > 0
+            share: root.timeLeft
         }
 
         Item {

@@ -1,4 +1,5 @@
 import QtQuick 2.15
+import ".."
 import "../controls"
 
 /** The road sign of a speed limit. */
@@ -11,14 +12,14 @@ Rectangle {
     width: root.size
     height: root.size
     radius: root.size / 2
-    color: "white"
+    color: Theme.text
     border.width: Math.round(root.size * 0.11)
-    border.color: "#d8232a"
+    border.color: Theme.critical
 
     Label {
         anchors.centerIn: parent
         text: root.limit
-        color: "#14181d"
+        color: Theme.background
         font.pixelSize: Math.round(root.size * (root.limit > 99 ? 0.34 : 0.42))
         font.weight: Font.Bold
     }
