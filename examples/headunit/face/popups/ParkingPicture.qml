@@ -1,5 +1,4 @@
 import QtQuick 2.15
-import QtQuick.Shapes 1.15
 import ".."
 
 /** The rear of the car from above, and the zones behind it up to what is in the way. */
@@ -13,6 +12,7 @@ Item {
 
     width: 284
     height: 264
+    clip: true
 
     Rectangle {
         id: body
@@ -34,14 +34,6 @@ Item {
         height: 30
         radius: 12
         color: Theme.background
-    }
-
-    // Cuts the car off where the picture ends.
-    Rectangle {
-        y: -26
-        width: root.width
-        height: 26
-        color: Theme.surface
     }
 
     Repeater {

@@ -21,7 +21,7 @@ PopupFrame {
 
         objectName: "popup-title"
         x: Theme.margin
-        y: 24
+        y: 12
         height: 72
         text: "Parking aid"
         strong: true
@@ -43,7 +43,7 @@ PopupFrame {
     ParkingPicture {
         anchors.horizontalCenter: parent.horizontalCenter
         anchors.top: title.bottom
-        anchors.topMargin: 0
+        anchors.topMargin: 8
         centimetres: root.centimetres
         ink: root.ink
     }
