@@ -8,7 +8,7 @@ QtObject {
     readonly property var albums: [
         { title: "Low Tide", artist: "Harbour Lights", year: 2021, first: "#f2a65a", second: "#772f54", pattern: 0 },
         { title: "Paper Satellites", artist: "Nova Quiet", year: 2023, first: "#5b7cfa", second: "#1b1f5e", pattern: 1 },
-        { title: "Blues for the Night Bus", artist: "The Lantern Four", year: 1998, first: "#2fb5c7", second: "#12384f", pattern: 2 },
+        { title: "Night Bus Blues", artist: "The Lantern Four", year: 1998, first: "#2fb5c7", second: "#12384f", pattern: 2 },
         { title: "Twin Orbits", artist: "Ada Merrow", year: 2019, first: "#e86f8b", second: "#4a2a6a", pattern: 3 },
         { title: "Fernweh Radio", artist: "Kolibri Club", year: 2024, first: "#7bd389", second: "#14523f", pattern: 4 },
         { title: "Signal & Noise", artist: "Ochre", year: 2016, first: "#f06449", second: "#5b1a2e", pattern: 5 }

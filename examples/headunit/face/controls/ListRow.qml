@@ -75,7 +75,7 @@ Rectangle {
     }
     Row {
         id: slot
-        anchors { right: end.left; verticalCenter: parent.verticalCenter }
+        anchors { right: end.left; rightMargin: end.width > 0 ? 12 : 0; verticalCenter: parent.verticalCenter }
         spacing: Theme.gap
     }
     Row {
