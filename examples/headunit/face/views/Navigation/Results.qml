@@ -46,7 +46,7 @@ Page {
         following: false
         carShown: true
         zoom: 0.46
-        centre: Qt.point(1560, 640)
+        centre: Qt.point(1600, 640)
         pins: root.found.map((place, i) => ({ x: places.get(place).px, y: places.get(place).py, sign: "ABC".charAt(i) }))
     }
 }
