@@ -9,7 +9,7 @@ Item {
     readonly property string time: Qt.formatTime(root.now, Preferences.clockFormat).replace(/ [AP]M$/, "")
     readonly property string date: root.now.toLocaleDateString(Qt.locale("en_GB"), "dddd, d MMMM")
     readonly property int hour: root.now.getHours()
-    readonly property string greeting: root.hour < 5 ? "Good night" : root.hour < 12 ? "Good morning"
+    readonly property string greeting: root.hour < 5 ? "Good evening" : root.hour < 12 ? "Good morning"
                                      : root.hour < 18 ? "Good afternoon" : "Good evening"
 
     /** The time of day in so many minutes from now. */
