@@ -2,6 +2,7 @@ import QtQuick 2.15
 import HeadUnit 1.0
 import "../.."
 import "../../controls"
+import "../Phone" as Phone
 
 /** The telephone, and who is called most with it. */
 Card {
@@ -46,33 +47,25 @@ Card {
 
         Repeater {
             model: [
-                { name: "Ann", color: "#e86f8b" },
-                { name: "Jonas", color: "#5b7cfa" },
-                { name: "Office", color: "#f2a65a" }
+                { name: "Ann Marlow", tint: "#3d7ea6" },
+                { name: "Ben Tarrow", tint: "#8a6a3f" },
+                { name: "Jonas Averill", tint: "#6f8a45" }
             ]
 
             Column {
                 width: 84
                 spacing: 4
 
-                Rectangle {
+                Phone.Avatar {
                     anchors.horizontalCenter: parent.horizontalCenter
                     width: 68
-                    height: 68
-                    radius: 34
-                    color: Qt.darker(modelData.color, 1.9)
-                    border { width: 2; color: modelData.color }
-
-                    Label {
-                        anchors.centerIn: parent
-                        text: modelData.name.charAt(0)
-                        font.weight: Font.DemiBold
-                    }
+                    name: modelData.name
+                    tint: modelData.tint
                 }
                 Label {
                     anchors.horizontalCenter: parent.horizontalCenter
                     kind: Label.Small
-                    text: modelData.name
+                    text: modelData.name.split(" ")[0]
                 }
             }
         }
