@@ -27,7 +27,7 @@ CameraLens {
     onPaint: {
         var context = root.getContext("2d")
         context.reset()
-        root.fill(context, [[-root.halfWidth, 0, 0.02], [root.halfWidth, 0, 0.02], [root.halfWidth, 0, 0.45], [-root.halfWidth, 0, 0.45]], "#30ff4d4f")
+        root.strip(context, -root.halfWidth, root.halfWidth, 0.02, 0.45, "#30ff4d4f")
         context.lineCap = "round"
         context.lineJoin = "round"
         context.lineWidth = 6

@@ -40,10 +40,20 @@ Page {
         Row {
             spacing: 10
 
-            Icon { anchors.verticalCenter: parent.verticalCenter; name: clock.hour < 7 || clock.hour > 19 ? "nights_stay" : "wb_sunny"; color: Theme.warning; size: 30 }
+            Icon {
+                anchors.verticalCenter: parent.verticalCenter
+                name: clock.hour < 7 || clock.hour > 19 ? "nights_stay" : "wb_sunny"
+                color: Theme.warning
+                size: 30
+            }
             Label { anchors.verticalCenter: parent.verticalCenter; kind: Label.Small; text: "14 °C" }
             Item { width: 14; height: 1 }
-            Icon { anchors.verticalCenter: parent.verticalCenter; name: "local_gas_station"; color: Vehicle.fuel < 10 ? Theme.warning : Theme.positive; size: 30 }
+            Icon {
+                anchors.verticalCenter: parent.verticalCenter
+                name: "local_gas_station"
+                color: Vehicle.fuel < 10 ? Theme.warning : Theme.positive
+                size: 30
+            }
             Label {
                 anchors.verticalCenter: parent.verticalCenter
                 kind: Label.Small

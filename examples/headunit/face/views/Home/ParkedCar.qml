@@ -53,7 +53,8 @@ CameraLens {
         root.tail(context, [[0.26, 0.56, 0], [0.26, 0.68, 0]], "#d6d9dd")
         for (var i = -1; i < 2; i += 2) {
             var x = root.middle + i * 0.66
-            root.fill(context, [[x - 0.2, 0.7, root.near], [x + 0.2, 0.7, root.near], [x + 0.2, 0.84, root.near], [x - 0.2, 0.84, root.near]], "#c8323a")
+            root.fill(context, [[x - 0.2, 0.7, root.near], [x + 0.2, 0.7, root.near],
+                                [x + 0.2, 0.84, root.near], [x - 0.2, 0.84, root.near]], "#c8323a")
         }
     }
 

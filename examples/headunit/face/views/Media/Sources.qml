@@ -12,7 +12,8 @@ Page {
     readonly property var sources: [
         { name: "usb", title: "USB stick", subtitle: "Travel mix, 214 tracks", icon: "usb", color: "#3da9fc" },
         { name: "radio", title: "Radio", subtitle: "Coast FM 97.4", icon: "radio", color: "#f5b14c" },
-        { name: "bluetooth", title: "Phone", subtitle: Vehicle.phoneConnected ? "Mara's phone" : "Not connected", icon: "bluetooth_audio", color: "#4ccf9a" }
+        { name: "bluetooth", title: "Phone", subtitle: Vehicle.phoneConnected ? "Mara's phone" : "Not connected",
+          icon: "bluetooth_audio", color: "#4ccf9a" }
     ]
 
     function play(album) {

@@ -56,7 +56,7 @@ Page {
         }
         Row {
             id: bar
-            anchors { left: parent.left; right: parent.right; bottom: parent.bottom; leftMargin: Theme.margin; rightMargin: Theme.margin; bottomMargin: 20 }
+            anchors { left: parent.left; right: parent.right; bottom: parent.bottom; margins: Theme.margin; bottomMargin: 20 }
             height: 84
             spacing: 24
 
