@@ -31,27 +31,36 @@ QtObject {
     }
 
     // Corners stand a bit beside where a ruler would put them.
-    function blocksOf(border, grid) {
+    function cornersOf(border, grid) {
         const xs = border.map(p => p.x), ys = border.map(p => p.y)
-        const middle = Qt.point((Math.min(...xs) + Math.max(...xs)) / 2, (Math.min(...ys) + Math.max(...ys)) / 2)
-        const reach = Math.hypot(Math.max(...xs) - middle.x, Math.max(...ys) - middle.y)
+        const left = Math.min(...xs), right = Math.max(...xs), top = Math.min(...ys), bottom = Math.max(...ys)
+        const middle = { x: (left + right) / 2, y: (top + bottom) / 2 }
+        const reach = Math.hypot(right - middle.x, bottom - middle.y)
         const columns = Math.ceil(reach / grid[1]), rows = Math.ceil(reach / grid[2])
         const cos = Math.cos(grid[0] * Math.PI / 180), sin = Math.sin(grid[0] * Math.PI / 180)
-        const corners = []
+        const lines = []
         for (let r = -rows; r <= rows; ++r) {
+            const line = []
             for (let c = -columns; c <= columns; ++c) {
                 const u = (c + (root.ground.chance() - 0.5) * 0.22) * grid[1]
                 const v = (r + (root.ground.chance() - 0.5) * 0.22) * grid[2]
-                corners.push(Qt.point(middle.x + u * cos - v * sin, middle.y + u * sin + v * cos))
+                const corner = { x: middle.x + u * cos - v * sin, y: middle.y + u * sin + v * cos }
+                corner.inside = corner.x > left && corner.x < right && corner.y > top && corner.y < bottom
+                                && root.ground.visibleAt(corner, 200) && root.ground.inside(corner, border)
+                line.push(corner)
             }
+            lines.push(line)
         }
-        const blocks = [], wide = 2 * columns + 1
-        for (let r = 0; r < 2 * rows; ++r) {
-            for (let c = 0; c < 2 * columns; ++c) {
-                const i = r * wide + c
-                const quad = [corners[i], corners[i + 1], corners[i + wide + 1], corners[i + wide]]
+        return lines
+    }
+
+    function blocksOf(border, grid) {
+        const lines = root.cornersOf(border, grid), blocks = []
+        for (let r = 0; r + 1 < lines.length; ++r) {
+            for (let c = 0; c + 1 < lines[r].length; ++c) {
+                const quad = [lines[r][c], lines[r][c + 1], lines[r + 1][c + 1], lines[r + 1][c]]
                 const open = root.ground.chance()
-                if (root.ground.visibleAt(quad[0], 200) && quad.some(p => root.ground.inside(p, border)))
+                if (quad.some(corner => corner.inside))
                     blocks.push({ quad: quad, open: open, main: r % 4 === 1, cross: c % 4 === 2 })
             }
         }
@@ -70,8 +79,8 @@ QtObject {
     // Two rows of houses back to back, with gardens and gaps between them.
     function paintBuildings(ctx, block, share) {
         const q = block.quad
-        const at = (u, v) => Qt.point((q[0].x * (1 - u) + q[1].x * u) * (1 - v) + (q[3].x * (1 - u) + q[2].x * u) * v,
-                                      (q[0].y * (1 - u) + q[1].y * u) * (1 - v) + (q[3].y * (1 - u) + q[2].y * u) * v)
+        const between = (a, b, t) => ({ x: a.x + (b.x - a.x) * t, y: a.y + (b.y - a.y) * t })
+        const at = (u, v) => between(between(q[0], q[1], u), between(q[3], q[2], u), v)
         ctx.beginPath()
         for (let side = 0; side < 2; ++side) {
             let u = 0.1

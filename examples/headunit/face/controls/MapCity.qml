@@ -89,11 +89,11 @@ QtObject {
             const a = at(i - 1), b = at(i), c = at(i + 1), d = at(i + 2)
             for (let s = 0; s < root.steps; ++s) {
                 const t = s / root.steps
-                line.push(Qt.point(mix(a[0], b[0], c[0], d[0], t), mix(a[1], b[1], c[1], d[1], t)))
+                line.push({ x: mix(a[0], b[0], c[0], d[0], t), y: mix(a[1], b[1], c[1], d[1], t) })
             }
         }
         const end = at(last)
-        line.push(Qt.point(end[0], end[1]))
+        line.push({ x: end[0], y: end[1] })
         return line
     }
 
@@ -107,7 +107,7 @@ QtObject {
     /** The samples of a street between two of its points; a single corner is itself. */
     function piece(part) {
         if (typeof part[0] === "number")
-            return [Qt.point(part[0], part[1])]
+            return [{ x: part[0], y: part[1] }]
         const from = part[1] * root.steps, to = part[2] * root.steps
         const line = root.lines[part[0]].slice(Math.min(from, to), Math.max(from, to) + 1)
         return from <= to ? line : line.reverse()
@@ -122,7 +122,7 @@ QtObject {
         return line.map((p, i) => {
             const a = line[Math.max(0, i - 1)], b = line[Math.min(line.length - 1, i + 1)]
             const length = Math.hypot(b.x - a.x, b.y - a.y)
-            return Qt.point(p.x - (b.y - a.y) / length * distance, p.y + (b.x - a.x) / length * distance)
+            return { x: p.x - (b.y - a.y) / length * distance, y: p.y + (b.x - a.x) / length * distance }
         })
     }
 }

@@ -22,7 +22,8 @@ Card {
         color: Theme.text
     }
     Column {
-        anchors { left: parent.left; leftMargin: 126; right: parent.right; rightMargin: 20; top: parent.top; topMargin: 20 }
+        anchors { left: parent.left; leftMargin: 126; right: parent.right; rightMargin: 20 }
+        y: 20
 
         Label {
             objectName: "guidance-distance"

@@ -10,8 +10,8 @@ Text {
     property real zoom: 1
 
     readonly property int from: Math.floor(root.at)
-    readonly property point a: root.line[root.from]
-    readonly property point b: root.line[root.from + 1]
+    readonly property var a: root.line[root.from]
+    readonly property var b: root.line[root.from + 1]
     readonly property real slope: Math.atan2(root.b.y - root.a.y, root.b.x - root.a.x) * 180 / Math.PI
 
     x: (root.a.x + (root.b.x - root.a.x) * (root.at - root.from)) * root.zoom - root.width / 2

@@ -35,8 +35,8 @@ QtObject {
         for (let i = 0; i + 1 < line.length; ++i) {
             for (const t of [0.1, 0.5]) {
                 const a = line[i], b = line[i + 1]
-                sleepers.push([Qt.point(a.x + (b.x - a.x) * t, a.y + (b.y - a.y) * t),
-                               Qt.point(a.x + (b.x - a.x) * (t + 0.22), a.y + (b.y - a.y) * (t + 0.22))])
+                sleepers.push([{ x: a.x + (b.x - a.x) * t, y: a.y + (b.y - a.y) * t },
+                               { x: a.x + (b.x - a.x) * (t + 0.22), y: a.y + (b.y - a.y) * (t + 0.22) }])
             }
         }
         root.ground.stroke(ctx, sleepers, 2.4, colours.town)
@@ -53,9 +53,9 @@ QtObject {
         ctx.beginPath(); ctx.arc(1150, 640, 16, 0, 2 * Math.PI); ctx.fill()
         ctx.fillStyle = colours.landmark
         ctx.beginPath()
-        root.ground.trace(ctx, [Qt.point(1245, 690), Qt.point(1300, 686), Qt.point(1303, 726), Qt.point(1248, 730)])
+        root.ground.trace(ctx, [{ x: 1245, y: 690 }, { x: 1300, y: 686 }, { x: 1303, y: 726 }, { x: 1248, y: 730 }])
         ctx.closePath()
-        root.ground.trace(ctx, [Qt.point(1010, 1130), Qt.point(1105, 1147), Qt.point(1100, 1172), Qt.point(1006, 1155)])
+        root.ground.trace(ctx, [{ x: 1010, y: 1130 }, { x: 1105, y: 1147 }, { x: 1100, y: 1172 }, { x: 1006, y: 1155 }])
         ctx.closePath()
         ctx.fill()
     }
