@@ -1,4 +1,5 @@
-import QtQml 2.15
+import QtQuick 2.15
+import ".."
 
 /** The colours of the map: dark at night, paper by day. */
 QtObject {
@@ -24,5 +25,5 @@ QtObject {
     readonly property color district: root.night ? "#7e8c9c" : "#7b7568"
     readonly property color waterLabel: root.night ? "#4f8fc4" : "#2f74a8"
     readonly property color halo: root.night ? "#0b1016" : "#f8f7f3"
-    readonly property color routeEdge: root.night ? "#0b3c69" : "#0c4f8c"
+    readonly property color routeEdge: Qt.darker(Theme.accent, root.night ? 2.6 : 1.8)
 }

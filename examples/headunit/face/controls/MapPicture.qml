@@ -30,6 +30,10 @@ Item {
     }
 
     clip: true
+    onVisibleChanged: {
+        if (root.visible)
+            way.look()
+    }
 
     MapCity { id: plan }
     MapColours { id: paints; night: root.night }
@@ -39,10 +43,7 @@ Item {
         interval: 40
         repeat: true
         running: root.following && root.visible && Vehicle.moving
-        onTriggered: {
-            const next = way.travelled + Vehicle.speed / 3.6 * 0.04
-            way.travelled = next < way.length ? next : 0
-        }
+        onTriggered: way.drive(Vehicle.speed / 3.6 * 0.04)
     }
 
     Item {

@@ -1,11 +1,12 @@
 import QtQml 2.15
+import "MapPlace.js" as Place
 
 /** The way home through the city, and where on it the car is. */
 QtObject {
     id: root
 
     required property MapCity city
-    property real travelled: 372 ///< metres from the start
+    property real travelled: Place.travelled ///< metres from the start
 
     readonly property var parts: [["west", 1, 0], ["south", 0, 3], ["harbour", 0, 3], ["ring", 6, 2],
                                   ["orchard", 2, 3]]
@@ -24,6 +25,8 @@ QtObject {
     ])
     readonly property var turn: root.turns.find(turn => turn.at > root.travelled) || root.turns[4]
     readonly property var afterwards: root.turns[root.turns.indexOf(root.turn) + 1]
+    readonly property string street: root.turns.indexOf(root.turn) > 0
+        ? root.turns[root.turns.indexOf(root.turn) - 1].street : "Mill Lane" ///< where the car is
     readonly property real distanceToTurn: Math.max(0, root.turn.at - root.travelled)
 
     // The plan leaves out most of the suburbs: the way is longer than it looks.
@@ -33,6 +36,18 @@ QtObject {
     readonly property int index: root.indexAt(root.travelled)
     readonly property point position: root.placeAt(root.index, root.travelled)
     readonly property real heading: root.headingAt(root.index)
+
+    /** Drives on; having arrived the car begins anew. */
+    function drive(metres) {
+        const next = root.travelled + metres
+        Place.travelled = next < root.length ? next : 0
+        root.look()
+    }
+
+    /** Looks where the car has come to meanwhile. */
+    function look() {
+        root.travelled = Place.travelled
+    }
 
     function measured(line) {
         const distances = [0]

@@ -59,6 +59,12 @@ Page {
         delayed: root.trafficShown
         onStopped: Requests.event("StopGuidance")
     }
+    MapStreetSign {
+        objectName: "street"
+        anchors { left: parent.left; leftMargin: 24; bottom: parent.bottom; bottomMargin: 24 }
+        visible: !root.guided
+        street: map.route.street
+    }
     MapLegend {
         anchors { right: parent.right; rightMargin: 24; bottom: parent.bottom; bottomMargin: 24 }
         visible: root.trafficShown
