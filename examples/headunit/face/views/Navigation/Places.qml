@@ -25,6 +25,5 @@ ListModel {
     ListElement { name: "Museum of the River"; detail: "Castle Park"; icon: "museum"; distance: "0.6 km"; px: 1275; py: 708 }
     ListElement { name: "Linden Hill Baths"; detail: "Linden Avenue 31"; icon: "pool"; distance: "2.8 km"; px: 1440; py: 1160 }
     ListElement { name: "Eastmere Lake"; detail: "Eastmere Park"; icon: "park"; distance: "5.0 km"; px: 1860; py: 820 }
-    ListElement { name: "Westbank Clinic"; detail: "Station Road 88"; icon: "local_hospital"; distance: "4.7 km"; px: 480; py: 890 }
     ListElement { name: "Northgate Garage"; detail: "Northgate 5"; icon: "local_parking"; distance: "1.4 km"; px: 1150; py: 330 }
 }
