@@ -1,0 +1,147 @@
+import QtQuick 2.15
+import HmiStateMachine 1.0
+import "."
+import "chrome"
+
+/** The display of the car, 1280 x 720, with the keys that are built in beside it. */
+Rectangle {
+    id: root
+
+    readonly property string view: ViewTarget.activeView
+    readonly property bool dark: root.view === "Home/Standby"
+    /** Screens that have the display to themselves. */
+    readonly property bool alone: root.dark || root.view === ""
+        || root.view === "Home/Welcome" || root.view === "Home/Language"
+
+    implicitWidth: 1280
+    implicitHeight: 720
+    color: root.dark ? "black" : Theme.background
+
+    Behavior on color {
+        ColorAnimation { duration: 260 }
+    }
+
+    // The dark display is one surface: it wakes wherever it is touched.
+    MouseArea {
+        anchors.fill: parent
+        enabled: root.dark
+        onClicked: Requests.view("Home/Main")
+    }
+
+    ScreenHost {
+        id: screenHost
+
+        objectName: "screenHost"
+        source: "views/%1.qml"
+        keep: 0
+        duration: 260
+        clip: true
+        anchors {
+            left: bezel.right
+            right: parent.right
+            top: statusBar.bottom
+            bottom: domainBar.top
+        }
+    }
+
+    StatusBar {
+        id: statusBar
+
+        anchors.left: bezel.right
+        anchors.right: parent.right
+        height: 56
+        titleShown: !root.alone
+        opacity: root.dark ? 0 : 1
+    }
+
+    DomainBar {
+        id: domainBar
+
+        anchors.left: bezel.right
+        anchors.right: parent.right
+        anchors.bottom: parent.bottom
+        height: 80
+        enabled: !root.alone && root.view !== "Home/RearCamera"
+        opacity: root.alone ? 0 : domainBar.enabled ? 1 : 0.3
+    }
+
+    PopupHost {
+        id: popupHost
+
+        objectName: "popupHost"
+        anchors {
+            left: bezel.right
+            right: parent.right
+            top: parent.top
+            bottom: parent.bottom
+        }
+
+        PopupComponent {
+            popupId: "CallBanner"
+            source: "popups/CallBanner.qml"
+        }
+        PopupComponent {
+            popupId: "FuelWarning"
+            source: "popups/FuelWarning.qml"
+        }
+        PopupComponent {
+            popupId: "FaultScreen"
+            source: "popups/FaultScreen.qml"
+        }
+        PopupComponent {
+            popupId: "navigation/traffic"
+            source: "popups/TrafficPopup.qml"
+        }
+        PopupComponent {
+            popupId: "system/update"
+            source: "popups/UpdatePopup.qml"
+        }
+        PopupComponent {
+            popupId: "system/voice"
+            source: "popups/VoicePopup.qml"
+        }
+        PopupComponent {
+            popupId: "media/volume"
+            source: "popups/VolumePopup.qml"
+        }
+        PopupComponent {
+            popupId: "car/speed"
+            source: "popups/SpeedPopup.qml"
+        }
+        PopupComponent {
+            popupId: "car/parking"
+            source: "popups/ParkingPopup.qml"
+        }
+        PopupComponent {
+            kind: 2
+            source: "popups/NotePopup.qml"
+        }
+        PopupComponent {
+            kind: 3
+            source: "popups/QuestionPopup.qml"
+        }
+        PopupComponent {
+            kind: 4
+            source: "popups/WarningPopup.qml"
+        }
+        PopupComponent {
+            kind: 5
+            source: "popups/OverlayPopup.qml"
+        }
+    }
+
+    HardKeyBezel {
+        id: bezel
+
+        lit: !root.dark
+        height: parent.height
+    }
+
+    Rectangle {
+        id: dimmer
+
+        anchors.fill: parent
+        color: "black"
+        opacity: 0.6 * Math.pow(1 - Preferences.brightness, 2)
+    }
+}

@@ -1,0 +1,81 @@
+import QtQuick 2.15
+import HmiStateMachine 1.0
+import ".."
+import "../controls"
+
+/** Somebody calls while something else is on the screen. */
+PopupFrame {
+    id: root
+
+    readonly property string caller: root.read("caller", "Unknown caller")
+
+    stateName: "phone/call"
+    modal: true
+    panelWidth: 760
+    panelHeight: 432
+
+    CallerPicture {
+        id: picture
+
+        anchors.horizontalCenter: parent.horizontalCenter
+        y: 40
+        caller: root.caller
+    }
+
+    Column {
+        anchors.top: picture.bottom
+        anchors.topMargin: 28
+        anchors.horizontalCenter: parent.horizontalCenter
+        width: parent.width - 96
+        spacing: 4
+
+        Label {
+            objectName: "popup-title"
+            width: parent.width
+            horizontalAlignment: Text.AlignHCenter
+            text: root.caller
+            kind: Label.Title
+        }
+
+        Label {
+            width: parent.width
+            horizontalAlignment: Text.AlignHCenter
+            text: "Incoming call"
+            muted: true
+        }
+    }
+
+    Row {
+        anchors {
+            left: parent.left
+            right: parent.right
+            bottom: parent.bottom
+            margins: Theme.margin
+        }
+        spacing: Theme.gap
+
+        TouchButton {
+            objectName: "dismiss"
+            width: (parent.width - Theme.gap) / 2
+            kind: TouchButton.Critical
+            icon: "call_end"
+            text: "Decline"
+            onClicked: {
+                root.dismiss();
+                Requests.event("CallEnded");
+            }
+        }
+
+        TouchButton {
+            objectName: "accept"
+            width: (parent.width - Theme.gap) / 2
+            kind: TouchButton.Positive
+            icon: "phone"
+            text: "Accept"
+            onClicked: {
+                Requests.view("Phone/InCall");
+                root.dismiss();
+            }
+        }
+    }
+}

@@ -1,0 +1,24 @@
+import QtQuick 2.15
+import "../.."
+
+/** The initials of somebody in a circle, in place of a photo. */
+Rectangle {
+    id: root
+
+    property string name
+    property color tint: "#4a5968"
+    readonly property string initials: root.name.split(" ").slice(0, 2).map(word => word.charAt(0)).join("")
+
+    width: 60
+    height: root.width
+    radius: root.width / 2
+    color: Qt.darker(root.tint, 1.15)
+    antialiasing: true
+
+    Text {
+        anchors.centerIn: parent
+        text: root.initials
+        color: "#ffffff"
+        font { family: Theme.font; pixelSize: Math.max(Theme.small, root.width * 0.36); weight: Font.Medium }
+    }
+}
