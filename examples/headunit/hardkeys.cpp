@@ -1,6 +1,9 @@
 #include "hardkeys.h"
 
+#include <HmiStateMachineQuick/requests.h>
+
 #include <QMetaEnum>
+#include <QVariantMap>
 
 namespace headunit {
 
@@ -28,6 +31,17 @@ QStringList HardKeys::names()
 int HardKeys::fromName(const QString &name)
 {
     return QMetaEnum::fromType<Key>().keyToValue(qPrintable(name));
+}
+
+void connectKeys(HmiStateMachine::Requests *requests, HardKeys *keys)
+{
+    QVariantMap codes;
+    const QStringList names = HardKeys::names();
+    for (const QString &name : names) {
+        codes.insert(name, HardKeys::fromName(name));
+    }
+    requests->setKeys(codes);
+    QObject::connect(requests, &HmiStateMachine::Requests::keyChanged, keys, &HardKeys::keyChanged);
 }
 
 } // namespace headunit

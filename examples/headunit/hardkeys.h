@@ -3,6 +3,10 @@
 #include <QObject>
 #include <QStringList>
 
+namespace HmiStateMachine {
+class Requests;
+} // namespace HmiStateMachine
+
 namespace headunit {
 
 /** The keys beside the screen. They only tell that they were pressed; the flow decides. */
@@ -33,5 +37,8 @@ Q_SIGNALS:
 private:
     Q_DISABLE_COPY(HardKeys)
 };
+
+/** Lets the keys that a scene asks for by name be pressed. */
+void connectKeys(HmiStateMachine::Requests *requests, HardKeys *keys);
 
 } // namespace headunit

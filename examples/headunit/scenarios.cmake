@@ -13,7 +13,7 @@ foreach(scenario IN LISTS scenarios)
             CMAKE_CONFIGURE_DEPENDS ${scenarios_dir}/${name}.options)
     endif()
     hmi_add_output_test(scenario-${name}
-        COMMAND headunit ${options} ${name}.scenario
+        COMMAND headunit --headless ${options} ${name}.scenario
         EXPECTED ${scenarios_dir}/${name}.expected
         DIRECTORY ${scenarios_dir}
         LABELS scenarios)
@@ -25,7 +25,7 @@ string(REPLACE "\n" "\r\n" text "${text}")
 string(ASCII 239 187 191 byte_order_mark)
 file(WRITE ${CMAKE_CURRENT_BINARY_DIR}/language-crlf.scenario "${byte_order_mark}${text}")
 hmi_add_output_test(scenario-language-crlf
-    COMMAND headunit --scenario ${CMAKE_CURRENT_BINARY_DIR}/language-crlf.scenario
+    COMMAND headunit --headless --scenario ${CMAKE_CURRENT_BINARY_DIR}/language-crlf.scenario
     EXPECTED ${scenarios_dir}/language.expected
     LABELS scenarios)
 
@@ -44,7 +44,7 @@ foreach(fault IN LISTS faults)
     endif()
     list(POP_FRONT arguments exit_code)
     hmi_add_output_test(fault-${name}
-        COMMAND headunit ${arguments}
+        COMMAND headunit --headless ${arguments}
         EXPECTED ${fault}
         EXIT_CODE ${exit_code}
         STREAM stderr
@@ -56,7 +56,7 @@ file(GLOB transcripts CONFIGURE_DEPENDS ${faults_dir}/*.transcript)
 foreach(transcript IN LISTS transcripts)
     get_filename_component(name ${transcript} NAME_WE)
     hmi_add_output_test(fault-${name}-transcript
-        COMMAND headunit ${name}.scenario
+        COMMAND headunit --headless ${name}.scenario
         EXPECTED ${transcript}
         EXIT_CODE 1
         DIRECTORY ${faults_dir}
@@ -73,11 +73,11 @@ foreach(input IN LISTS inputs)
 endforeach()
 
 hmi_add_output_test(headunit-list
-    COMMAND headunit --list
+    COMMAND headunit --headless --list
     EXPECTED ${CMAKE_CURRENT_SOURCE_DIR}/tests/list.expected
     LABELS examples)
-add_test(NAME headunit-help COMMAND headunit --help)
-add_test(NAME headunit-verbose COMMAND headunit --verbose ${scenarios_dir}/voice.scenario)
+add_test(NAME headunit-help COMMAND headunit --headless --help)
+add_test(NAME headunit-verbose COMMAND headunit --headless --verbose ${scenarios_dir}/voice.scenario)
 set_tests_properties(headunit-help headunit-verbose PROPERTIES LABELS examples TIMEOUT 30)
 set_tests_properties(headunit-help PROPERTIES
     PASS_REGULAR_EXPRESSION "wait MILLISECONDS.*--scenario <FILE>.*--list")

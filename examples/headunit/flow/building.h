@@ -22,12 +22,29 @@ class HardKeys;
 class Vehicle;
 class ViewLayer;
 
+/** How long things take in the flow, in milliseconds. */
+struct Timing
+{
+    int welcome; ///< how long the welcome screen can be seen at least
+    int connecting; ///< after which a source that does not connect is given up
+    int note; ///< after which a note goes by itself
+    int volume; ///< the same for the volume
+    int volumeTick; ///< how often the volume tells what is left of its time
+};
+
+/** For scenarios: long enough to be told apart, short enough not to be waited for. */
+constexpr Timing scenarioTiming{150, 120, 100, 200, 50};
+
+/** For a person, who wants to read. */
+constexpr Timing personTiming{1800, 4000, 4000, 3000, 100};
+
 /** What the flow listens to and tells things to; all of it outlives the flow's use. */
 struct Surroundings
 {
     Vehicle *vehicle;
     HardKeys *keys;
     ViewLayer *viewLayer;
+    Timing timing;
 };
 
 /** The state of that name; a name that no state has is an error of the flow and ends the demo. */

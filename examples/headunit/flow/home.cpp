@@ -20,12 +20,10 @@ namespace headunit {
 
 namespace {
 
-constexpr int welcomeMs = 150;
-
 // However fast the systems come up, the welcome screen can be seen.
-void showWelcomeForAWhile(Vehicle *vehicle)
+void showWelcomeForAWhile(Vehicle *vehicle, int milliseconds)
 {
-    auto *ready = new HmiDelayedSignalTransition(vehicle, SIGNAL(systemReady()), welcomeMs,
+    auto *ready = new HmiDelayedSignalTransition(vehicle, SIGNAL(systemReady()), milliseconds,
                                                  state("Home/Welcome"));
     ready->setTargetState(state("Home/Main"));
 }
@@ -86,7 +84,7 @@ void addHomeViews(QState *domain, const Surroundings &)
 void addHomeTransitions(const Surroundings &surroundings)
 {
     addStartUpTransitions(surroundings);
-    showWelcomeForAWhile(surroundings.vehicle);
+    showWelcomeForAWhile(surroundings.vehicle, surroundings.timing.welcome);
     showCameraInReverse(surroundings.vehicle);
     keepCameraInFront(surroundings.keys);
     switchDisplayOff();

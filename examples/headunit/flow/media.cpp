@@ -19,12 +19,10 @@ namespace headunit {
 
 namespace {
 
-constexpr int connectingMs = 120;
-
 // While a source connects nothing new is shown. When it takes too long, the sources come back.
-void addConnectingView(QState *domain)
+void addConnectingView(QState *domain, int timeoutMs)
 {
-    HmiViewState::createDummyViewState("Media/Connecting", domain, connectingMs, true);
+    HmiViewState::createDummyViewState("Media/Connecting", domain, timeoutMs, true);
 }
 
 void connectSources()
@@ -67,10 +65,10 @@ void closeVideoWhenMoving(Vehicle *vehicle)
 
 } // namespace
 
-void addMediaViews(QState *domain, const Surroundings &)
+void addMediaViews(QState *domain, const Surroundings &surroundings)
 {
     HmiViewState *sources = addView("Media/Sources", domain);
-    addConnectingView(domain);
+    addConnectingView(domain, surroundings.timing.connecting);
     addView("Media/Browser", domain);
     HmiViewState *player = addView("Media/Player", domain);
     HmiViewState *queue = addViewWithoutBack("Media/Queue", domain);

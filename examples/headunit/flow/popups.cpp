@@ -66,7 +66,7 @@ void addPopups(const Surroundings &surroundings)
     addAdvertisement();
     tellOf(popup("navigation/advert"), surroundings.viewLayer);
 
-    setTimeouts();
+    setTimeouts(surroundings.timing);
     keepFaultOpen();
     warnOfSpeed(surroundings);
     restrictToStanding(surroundings);

@@ -3,6 +3,7 @@
 namespace headunit {
 
 struct Surroundings;
+struct Timing;
 
 /** What the view layer is told a popup is, so that it can place it. */
 enum PopupKind { NotePopup = 2, QuestionPopup = 3, WarningPopup = 4, OverlayPopup = 5 };
@@ -17,7 +18,7 @@ void addPopups(const Surroundings &surroundings);
 void addAdvertisement();
 
 /** These go away by themselves, and the volume tells how long that takes. */
-void setTimeouts();
+void setTimeouts(const Timing &timing);
 
 /** Cannot be dismissed: it stays until the fault is repaired. */
 void keepFaultOpen();

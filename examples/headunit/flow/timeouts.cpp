@@ -10,10 +10,6 @@ namespace headunit {
 
 namespace {
 
-constexpr int noteMs = 100;
-constexpr int volumeMs = 200;
-constexpr int volumeTickMs = 50;
-
 void closeAfter(int milliseconds, PopupState *popup)
 {
     popup->setAutoDismissTimeoutInterval(milliseconds);
@@ -22,11 +18,11 @@ void closeAfter(int milliseconds, PopupState *popup)
 
 } // namespace
 
-void setTimeouts()
+void setTimeouts(const Timing &timing)
 {
-    closeAfter(noteMs, popup("phone/ended"));
-    closeAfter(volumeMs, popup("media/volume"));
-    new PopupTimeoutMonitor(volumeTickMs, popup("media/volume"));
+    closeAfter(timing.note, popup("phone/ended"));
+    closeAfter(timing.volume, popup("media/volume"));
+    new PopupTimeoutMonitor(timing.volumeTick, popup("media/volume"));
 }
 
 } // namespace headunit

@@ -174,6 +174,11 @@ Action parseSay(Arguments &arguments)
 
 } // namespace
 
+bool isStep(CommandKind kind)
+{
+    return kind == CommandKind::Step || kind == CommandKind::Wait;
+}
+
 const QList<CommandDefinition> &commandDefinitions()
 {
     static const QList<CommandDefinition> definitions{
@@ -195,7 +200,7 @@ const QList<CommandDefinition> &commandDefinitions()
          CommandKind::Step, parseBurst},
         {"domain", "domain NAME", "another domain takes over, without a change of view",
          CommandKind::Step, parseDomain},
-        {"wait", "wait MILLISECONDS", "let time pass", CommandKind::Step, parseWait},
+        {"wait", "wait MILLISECONDS", "let time pass", CommandKind::Wait, parseWait},
         {"try", "try view NAME [JSON] | try back DEPTH NAME",
          "a request with a name that need not exist", CommandKind::Step, parseTry},
         {"expect", expectUsage, "stop unless all is as expected", CommandKind::Check, parseExpect},

@@ -29,8 +29,12 @@ using Action = std::function<std::optional<Fault>(Stage &)>;
 enum class CommandKind {
     Narration, ///< only tells something
     Step, ///< makes something happen, what came of it is shown below
+    Wait, ///< a step in which time passes
     Check ///< looks whether all is as expected
 };
+
+/** Whether it makes something happen. */
+bool isStep(CommandKind kind);
 
 /** A command of the scenario language. To add one, write a parse function and list it. */
 struct CommandDefinition

@@ -1,5 +1,6 @@
 #include "scenariorunner.h"
 
+#include "audience.h"
 #include "transcript.h"
 #include "viewlayer.h"
 
@@ -11,17 +12,19 @@ using namespace HmiStateMachine;
 
 namespace headunit {
 
-ScenarioRunner::ScenarioRunner(const Stage &stage) : m_stage(stage)
+ScenarioRunner::ScenarioRunner(const Stage &stage, Audience *audience)
+    : m_stage(stage), m_audience(audience)
 {
 }
 
 // What start-up shows is not counted: scenarios count from their own first command.
-void ScenarioRunner::start()
+std::optional<Fault> ScenarioRunner::start()
 {
     m_stage.transcript->narration("The head unit starts.");
     StateMachine::instance()->start();
-    settle();
+    const auto fault = settle();
     m_stage.transcript->resetCalls();
+    return fault;
 }
 
 std::optional<LocatedFault> ScenarioRunner::run(const QVector<Command> &commands)
@@ -41,20 +44,27 @@ std::optional<Fault> ScenarioRunner::runCommand(const Command &command)
         return command.action(m_stage);
     }
     transcript.command(command.echo);
-    const auto fault = command.action(m_stage);
-    settle();
+    if (m_audience) {
+        m_audience->commandBegins(command);
+    }
+    auto fault = command.action(m_stage);
+    const auto sceneFault = settle();
     m_stage.viewLayer->takeVoiceRequest(); // one that no view has taken
-    if (command.kind == CommandKind::Step && transcript.linesOfCommand() == 0) {
+    if (isStep(command.kind) && transcript.linesOfCommand() == 0) {
         transcript.note("no call");
     }
-    return fault;
+    if (!fault && !sceneFault && m_audience) {
+        fault = m_audience->commandEnds(command);
+    }
+    return fault ? fault : sceneFault;
 }
 
 // Carries out all that is posted, and what that posts in turn, without letting time pass.
-void ScenarioRunner::settle()
+std::optional<Fault> ScenarioRunner::settle()
 {
     QCoreApplication::sendPostedEvents();
     QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
+    return m_audience ? m_audience->settle() : std::nullopt;
 }
 
 } // namespace headunit

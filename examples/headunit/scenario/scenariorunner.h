@@ -4,22 +4,26 @@
 
 namespace headunit {
 
+class Audience;
+
 /** Starts the machine and runs commands one after the other, each until nothing moves any more. */
 class ScenarioRunner
 {
 public:
-    explicit ScenarioRunner(const Stage &stage);
+    /** @p audience may be null, and outlives this. */
+    explicit ScenarioRunner(const Stage &stage, Audience *audience = nullptr);
 
-    void start();
+    std::optional<Fault> start();
 
     /** Stops at the first fault. */
     std::optional<LocatedFault> run(const QVector<Command> &commands);
 
 private:
     std::optional<Fault> runCommand(const Command &command);
-    void settle();
+    std::optional<Fault> settle();
 
     Stage m_stage;
+    Audience *m_audience;
 };
 
 } // namespace headunit

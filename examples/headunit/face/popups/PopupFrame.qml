@@ -36,7 +36,7 @@ Item {
     default property alias content: inside.data
 
     function read(key, otherwise) {
-        const data = root.popupData;
+        const data = root.popupData ? root.popupData.eventData : undefined;
         return data && data[key] !== undefined ? data[key] : otherwise;
     }
 

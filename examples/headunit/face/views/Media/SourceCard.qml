@@ -24,6 +24,8 @@ Card {
         color: Qt.rgba(root.tint.r, root.tint.g, root.tint.b, 0.18)
 
         Icon {
+            id: picture
+
             anchors.centerIn: parent
             name: root.connecting ? "autorenew" : root.icon
             size: 48
@@ -35,7 +37,7 @@ Card {
                 from: 0
                 to: 360
                 duration: 1200
-                onStopped: target.rotation = 0
+                onStopped: picture.rotation = 0
             }
         }
     }
