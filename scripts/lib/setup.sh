@@ -52,8 +52,23 @@ Install them as root, then run this again:
         apt-get install -q -y --no-install-recommends "${missing[@]}"
 }
 
+# Runs a command on a display of its own, which goes with it.
+run_under_xvfb() {
+    xvfb-run --auto-servernum --server-args='-screen 0 1920x1080x24' "$@"
+}
+
 # What every build needs.
 build_packages=(cmake ninja-build g++ ccache qtbase5-dev)
+
+# What the view layer for Qt Quick needs, to be built and to be imported; its tools check QML files.
+quick_packages=(qtdeclarative5-dev qtdeclarative5-dev-tools qml-module-qtqml-models2
+    qml-module-qtquick2 qml-module-qtquick-shapes qml-module-qtquick-window2)
+
+# The fonts of the head unit's screens.
+scene_packages=(fonts-inter fonts-material-design-icons-iconfont)
+
+# A display that nobody sees.
+xvfb_packages=(xvfb xauth)
 
 # What the benchmarks need beside that, and so the preset "release". Qt SCXML's CMake files ask for
 # Qt Qml, which its own package does not bring.
