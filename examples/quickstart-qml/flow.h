@@ -1,0 +1,4 @@
+#pragma once
+
+/** Three screens and two popups, in StateMachine::instance(). */
+void buildFlow();

@@ -1,0 +1,20 @@
+# The example that the way into Qt Quick is shown by: its scene and flow without its main().
+set(quickstart_dir ${PROJECT_SOURCE_DIR}/examples/quickstart-qml)
+hmi_add_test(quickstart quickstart)
+target_sources(tst_quickstart PRIVATE
+    ${quickstart_dir}/flow.cpp
+    ${quickstart_dir}/flow.h
+    ${quickstart_dir}/qml.qrc)
+set_target_properties(tst_quickstart PROPERTIES AUTORCC ON)
+target_include_directories(tst_quickstart PRIVATE ${quickstart_dir})
+target_link_libraries(tst_quickstart PRIVATE HmiStateMachine::Quick)
+set_tests_properties(quickstart PROPERTIES
+    LABELS "quickstart;realtime"
+    ENVIRONMENT "QT_QPA_PLATFORM=offscreen;QT_QUICK_BACKEND=software")
+
+# So that it stays a quick start.
+add_test(NAME quickstart-qml-size COMMAND ${CMAKE_COMMAND}
+    -D EXAMPLE_DIR=${quickstart_dir}
+    -D MAXIMUM=150
+    -P ${CMAKE_CURRENT_LIST_DIR}/size.cmake)
+set_tests_properties(quickstart-qml-size PROPERTIES LABELS quickstart TIMEOUT 30)
