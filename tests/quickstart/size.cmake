@@ -2,6 +2,8 @@
 #
 # Fails when the C++ and QML of the example have more lines than that, blank ones included.
 
+cmake_minimum_required(VERSION 3.22)
+
 set(total 0)
 foreach(pattern IN ITEMS *.cpp *.h *.qml)
     file(GLOB files ${EXAMPLE_DIR}/${pattern})

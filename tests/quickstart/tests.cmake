@@ -18,3 +18,10 @@ add_test(NAME quickstart-qml-size COMMAND ${CMAKE_COMMAND}
     -D MAXIMUM=150
     -P ${CMAKE_CURRENT_LIST_DIR}/size.cmake)
 set_tests_properties(quickstart-qml-size PROPERTIES LABELS quickstart TIMEOUT 30)
+
+# What the page shows of it is what it is.
+add_test(NAME quickstart-qml-docs COMMAND ${CMAKE_COMMAND}
+    -D PAGE=${PROJECT_SOURCE_DIR}/docs/quickstart-qml.md
+    -D EXAMPLE_DIR=${quickstart_dir}
+    -P ${CMAKE_CURRENT_LIST_DIR}/docs.cmake)
+set_tests_properties(quickstart-qml-docs PROPERTIES LABELS quickstart TIMEOUT 30)

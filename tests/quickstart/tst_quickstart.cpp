@@ -315,6 +315,7 @@ void tst_QuickStart::screensMoveForwardsAndBack()
 void tst_QuickStart::cleanupTestCase()
 {
     qInstallMessageHandler(m_previous);
+    QCOMPARE(s_console, QStringList()); // nor as the last scene went
 }
 
 QTEST_MAIN(tst_QuickStart)
