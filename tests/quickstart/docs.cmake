@@ -10,7 +10,7 @@ function(without_indentation text result)
     set(${result} "${text}" PARENT_SCOPE)
 endfunction()
 
-file(GLOB files ${EXAMPLE_DIR}/*.cpp ${EXAMPLE_DIR}/*.h ${EXAMPLE_DIR}/*.qml
+file(GLOB_RECURSE files ${EXAMPLE_DIR}/*.cpp ${EXAMPLE_DIR}/*.h ${EXAMPLE_DIR}/*.qml
     ${EXAMPLE_DIR}/CMakeLists.txt)
 set(sources "")
 foreach(file IN LISTS files)

@@ -25,3 +25,22 @@ add_test(NAME quickstart-qml-docs COMMAND ${CMAKE_COMMAND}
     -D EXAMPLE_DIR=${quickstart_dir}
     -P ${CMAKE_CURRENT_LIST_DIR}/docs.cmake)
 set_tests_properties(quickstart-qml-docs PROPERTIES LABELS quickstart TIMEOUT 30)
+
+# What docs/qml.md shows is compiled, loaded and run.
+hmi_add_test(quickstart qmlpage)
+target_link_libraries(tst_qmlpage PRIVATE HmiStateMachine::Quick)
+target_compile_definitions(tst_qmlpage PRIVATE
+    SNIPPETS_DIR="${CMAKE_CURRENT_LIST_DIR}/snippets")
+set_tests_properties(qmlpage PROPERTIES
+    ENVIRONMENT "QT_QPA_PLATFORM=offscreen;QT_QUICK_BACKEND=software")
+add_test(NAME quick-docs-code COMMAND ${CMAKE_COMMAND}
+    -D PAGE=${PROJECT_SOURCE_DIR}/docs/qml.md
+    -D EXAMPLE_DIR=${CMAKE_CURRENT_LIST_DIR}/snippets
+    -P ${CMAKE_CURRENT_LIST_DIR}/docs.cmake)
+
+# It leaves nothing out.
+add_test(NAME quick-docs COMMAND ${CMAKE_COMMAND}
+    -D PAGE=${PROJECT_SOURCE_DIR}/docs/qml.md
+    -D TYPES=${PROJECT_SOURCE_DIR}/src/HmiStateMachineQuick/plugin/plugins.qmltypes
+    -P ${CMAKE_CURRENT_LIST_DIR}/reference.cmake)
+set_tests_properties(quick-docs-code quick-docs PROPERTIES LABELS quickstart TIMEOUT 30)
