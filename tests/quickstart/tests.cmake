@@ -26,6 +26,17 @@ add_test(NAME quickstart-qml-docs COMMAND ${CMAKE_COMMAND}
     -P ${CMAKE_CURRENT_LIST_DIR}/docs.cmake)
 set_tests_properties(quickstart-qml-docs PROPERTIES LABELS quickstart TIMEOUT 30)
 
+# It can be copied out of here, and built with what is installed.
+if(HMISTATEMACHINE_TEST_PACKAGE)
+    add_test(NAME quickstart-qml-alone COMMAND ${CMAKE_COMMAND}
+        -D BUILD_DIR=${PROJECT_BINARY_DIR}
+        -D EXAMPLE_DIR=${quickstart_dir}
+        -D WORK_DIR=${CMAKE_CURRENT_BINARY_DIR}/quickstart-alone
+        -D CXX_COMPILER=${CMAKE_CXX_COMPILER}
+        -P ${CMAKE_CURRENT_LIST_DIR}/alone.cmake)
+    set_tests_properties(quickstart-qml-alone PROPERTIES LABELS "quickstart;package" TIMEOUT 900)
+endif()
+
 # What docs/qml.md shows is compiled, loaded and run.
 hmi_add_test(quickstart qmlpage)
 target_link_libraries(tst_qmlpage PRIVATE HmiStateMachine::Quick)
