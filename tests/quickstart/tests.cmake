@@ -12,6 +12,13 @@ set_tests_properties(quickstart PROPERTIES
     LABELS "quickstart;realtime"
     ENVIRONMENT "QT_QPA_PLATFORM=offscreen;QT_QUICK_BACKEND=software")
 
+find_program(HMI_TEST_QMLLINT NAMES qmllint)
+if(HMI_TEST_QMLLINT)
+    file(GLOB qml_files CONFIGURE_DEPENDS ${quickstart_dir}/*.qml)
+    add_test(NAME quickstart-qml-lint COMMAND ${HMI_TEST_QMLLINT} ${qml_files})
+    set_tests_properties(quickstart-qml-lint PROPERTIES LABELS quickstart TIMEOUT 30)
+endif()
+
 # So that it stays a quick start.
 add_test(NAME quickstart-qml-size COMMAND ${CMAKE_COMMAND}
     -D EXAMPLE_DIR=${quickstart_dir}
