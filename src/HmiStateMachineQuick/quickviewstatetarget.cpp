@@ -21,7 +21,6 @@ namespace HmiStateMachine {
 namespace {
 
 constexpr int tickMs = 100; // a bar of ten centimetres that empties in five seconds moves 2 mm
-constexpr int noDomain = -1;
 constexpr int dayMs = 24 * 60 * 60 * 1000;
 const auto entryReasonKey = QStringLiteral("entryReason");
 
@@ -203,9 +202,8 @@ void QuickViewStateTarget::reportLoadError(const LoadError &error)
     const QString place = error.line < 0
         ? error.file.toString()
         : error.file.toString() + QLatin1Char(':') + QString::number(error.line);
-    qCWarning(hmistatemachinequick).noquote().nospace()
-        << '"' << error.id << "\" cannot be shown: " << place << (place.isEmpty() ? "" : ": ")
-        << error.text;
+    qCWarning(hmistatemachinequick, "\"%s\" cannot be shown: %s%s%s", qUtf8Printable(error.id),
+              qUtf8Printable(place), place.isEmpty() ? "" : ": ", qUtf8Printable(error.text));
     Q_EMIT loadFailed(error.id, error.file, error.line, error.text);
 }
 

@@ -143,7 +143,7 @@ void Requests::key(const QString &name, int status)
 
 void Requests::warn(const QString &text)
 {
-    qCWarning(hmistatemachinequick).noquote() << text;
+    qCWarning(hmistatemachinequick, "%s", qUtf8Printable(text));
     Q_EMIT warned(text);
 }
 

@@ -56,6 +56,8 @@ public:
     /** Dismisses whichever popup is in front, in each layer. */
     Q_INVOKABLE void dismissAny();
 
+    using QObject::event; // stays in sight beside what follows
+
     /** An HmiEvent, whose names only the transitions know. */
     Q_INVOKABLE void event(const QString &name, const QVariant &data = QVariant());
 

@@ -244,7 +244,7 @@ void ScreenHost::showWarning(const QString &text)
                             QUrl(QStringLiteral("qrc:/HmiStateMachineQuick/WarningBanner.qml")));
     auto *banner = qobject_cast<QQuickItem *>(component.beginCreate(qmlContext(this)));
     if (!banner) {
-        qCWarning(hmistatemachinequick).noquote() << "no banner:" << component.errorString();
+        qCWarning(hmistatemachinequick, "no banner: %s", qUtf8Printable(component.errorString()));
         return;
     }
     m_banner = banner;

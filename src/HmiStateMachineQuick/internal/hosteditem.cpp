@@ -156,7 +156,8 @@ void HostedItem::standIn(const LoadError &error, const std::function<void()> &re
     auto *item = qobject_cast<QQuickItem *>(
         component->beginCreate(declared ? declared : qmlContext(m_host)));
     if (!item) {
-        qCWarning(hmistatemachinequick).noquote() << "no error item:" << component->errorString();
+        qCWarning(hmistatemachinequick, "no error item: %s",
+                  qUtf8Printable(component->errorString()));
         item = new QQuickItem;
     }
     prepare(item,
