@@ -46,6 +46,20 @@ PopupState *stateOf(const QString &popupId)
                                                       : PopupState::stateForTarget(popupId);
 }
 
+// A back press takes the one or the other way, never both.
+QString backTargetOf(const HmiViewState *view)
+{
+    const auto *direct = qobject_cast<const NamedState *>(view->directBackTransitionTarget());
+    return direct ? QString(direct->name()) : view->backTarget();
+}
+
+// From a dummy without back handling of its own, back leads to where it led from the view before.
+bool borrowsBackTarget(const HmiViewState *view)
+{
+    return view->targetView().isEmpty() && !view->handlesBackEvent()
+        && !view->directBackTransitionTarget();
+}
+
 int ageMs(const QTime &time, const QTime &now)
 {
     return (now.msecsSinceStartOfDay() - time.msecsSinceStartOfDay() + dayMs) % dayMs;
@@ -423,7 +437,10 @@ void QuickViewStateTarget::followViewState()
 
 void QuickViewStateTarget::updateBackTarget()
 {
-    const QString target = m_viewState ? m_viewState->backTarget() : QString();
+    if (m_viewState && borrowsBackTarget(m_viewState)) {
+        return;
+    }
+    const QString target = m_viewState ? backTargetOf(m_viewState) : QString();
     if (target != m_backTarget) {
         m_backTarget = target;
         Q_EMIT backTargetChanged();
