@@ -60,6 +60,16 @@ bool borrowsBackTarget(const HmiViewState *view)
         && !view->directBackTransitionTarget();
 }
 
+// A layer that is reset speaks of its popups by the names of their states.
+QString viewIdOf(const QString &popup, const PopupListModel *shown)
+{
+    if (shown->indexOf(popup) >= 0) {
+        return popup;
+    }
+    const PopupState *state = PopupState::stateForTarget(popup);
+    return state ? state->popupViewId() : popup;
+}
+
 int ageMs(const QTime &time, const QTime &now)
 {
     return (now.msecsSinceStartOfDay() - time.msecsSinceStartOfDay() + dayMs) % dayMs;
@@ -275,8 +285,9 @@ void QuickViewStateTarget::requestPopupShow(const QString &popupId, int popupKin
     }
 }
 
-void QuickViewStateTarget::requestPopupHide(const QString &popupId, bool deactivated)
+void QuickViewStateTarget::requestPopupHide(const QString &popup, bool deactivated)
 {
+    const QString popupId = viewIdOf(popup, m_shownPopups);
     // The library says so more than once.
     if (m_shownPopups->remove(popupId)) {
         if (m_popupPresenter) {
@@ -298,8 +309,9 @@ void QuickViewStateTarget::stackPopup(const QString &popupId, const QString &sta
     updateStack();
 }
 
-void QuickViewStateTarget::unstackPopup(const QString &popupId)
+void QuickViewStateTarget::unstackPopup(const QString &popup)
 {
+    const QString popupId = viewIdOf(popup, m_shownPopups);
     if (!ViewStateTarget::stackedPopups().contains(popupId)) {
         return; // the library does so whenever it shows or hides a popup
     }
