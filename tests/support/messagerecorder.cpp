@@ -7,6 +7,7 @@ namespace {
 MessageRecorder *s_recorder = nullptr;
 
 const QString libraryCategory = QStringLiteral("vosk.hmistatemachine");
+const QString sceneCategory = QStringLiteral("hmistatemachine.quick");
 const QString quiet = QStringLiteral("vosk.hmistatemachine.debug=false\nhmi.*.debug=false\n");
 
 QString levelName(QtMsgType type)
@@ -80,7 +81,7 @@ QList<Message> MessageRecorder::takeMessages()
 void MessageRecorder::handle(QtMsgType type, const QMessageLogContext &context, const QString &text)
 {
     const QString category = QString::fromLatin1(context.category);
-    if (category == libraryCategory || category.startsWith("hmi.")) {
+    if (category == libraryCategory || category == sceneCategory || category.startsWith("hmi.")) {
         s_recorder->m_messages.append({type, category, QString::fromLatin1(context.file),
                                        context.line, QString::fromLatin1(context.function), text});
     } else if (s_recorder->m_previous) {

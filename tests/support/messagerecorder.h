@@ -20,8 +20,8 @@ struct Message
 };
 
 /**
- * Keeps the messages of the library's, the trace and the performance category while it lives, and
- * hands all others on to the handler that was there before.
+ * Keeps the messages of the library's, its scene's, the trace and the performance category while it
+ * lives, and hands all others on to the handler that was there before.
  *
  * Debug output of these categories is off until it is asked for. One recorder at a time.
  */
