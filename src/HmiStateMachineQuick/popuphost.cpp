@@ -57,7 +57,9 @@ void PopupHost::setSuppressedLayers(const QStringList &layers)
         return;
     }
     m_suppressedLayers = layers;
-    updateOrder();
+    if (target()) { // there is none yet while the scene is being made
+        updateOrder();
+    }
     Q_EMIT suppressedLayersChanged();
 }
 
@@ -98,7 +100,7 @@ void PopupHost::withdrawPopup(const QString &popupId)
         return;
     }
     if (!popup->item()) {
-        popup->deleteLater(); // was never shown
+        popup->discard(); // was never shown
         busyChanged();
         return;
     }
@@ -134,6 +136,19 @@ void PopupHost::detach(QuickViewStateTarget *target)
     target->shownPopups()->disconnect(this);
     if (target->popupPresenter() == this) {
         target->setPopupPresenter(nullptr);
+    }
+}
+
+void PopupHost::clear()
+{
+    for (HostedItem *popup : m_popups.values() + m_leaving.values()) {
+        popup->discard();
+    }
+    m_popups.clear();
+    m_leaving.clear();
+    if (m_top) {
+        m_top = nullptr;
+        Q_EMIT topItemChanged();
     }
 }
 
@@ -193,7 +208,7 @@ void PopupHost::appear(HostedItem *popup)
 void PopupHost::remove(HostedItem *popup)
 {
     m_leaving.remove(popup->id());
-    popup->deleteLater();
+    popup->discard();
     updateOrder();
     busyChanged();
     target()->reportPopupHidden(popup->id());

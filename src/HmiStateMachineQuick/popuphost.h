@@ -66,6 +66,7 @@ Q_SIGNALS:
 protected:
     void attach(QuickViewStateTarget *target) override;
     void detach(QuickViewStateTarget *target) override;
+    void clear() override;
     HostedComponent *declaredComponent(const QString &id) const override;
 
 private:

@@ -93,9 +93,14 @@ void SceneHost::followTarget(QuickViewStateTarget *target)
     if (m_target) {
         m_target->disconnect(this);
         detach(m_target);
+        clear();
     }
     m_target = target;
     if (target) {
+        connect(target, &QObject::destroyed, this, [this] {
+            clear();
+            Q_EMIT targetChanged();
+        });
         attach(target);
     }
 }

@@ -87,6 +87,9 @@ protected:
     virtual void attach(QuickViewStateTarget *target) = 0;
     virtual void detach(QuickViewStateTarget *target) = 0;
 
+    /** Lets go of all items, because the target to which they belong is not shown any more. */
+    virtual void clear() = 0;
+
     /** The component that is declared for @p id; null when there is none. */
     virtual HostedComponent *declaredComponent(const QString &id) const = 0;
 

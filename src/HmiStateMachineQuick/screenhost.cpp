@@ -76,7 +76,7 @@ QQuickItem *ScreenHost::currentItem() const
 void ScreenHost::presentView(const QString &viewId, bool back)
 {
     if (m_pending) {
-        m_pending->deleteLater();
+        m_pending->discard();
         m_pending = nullptr;
     }
     if (m_current && m_current->id() == viewId && !m_current->hasFailed()) {
@@ -120,6 +120,26 @@ void ScreenHost::detach(QuickViewStateTarget *target)
     }
     if (target->viewPresenter() == this) {
         target->setViewPresenter(nullptr);
+    }
+}
+
+void ScreenHost::clear()
+{
+    const bool shown = m_current;
+    for (HostedItem *item : {m_pending, m_current, m_leaving}) {
+        if (item) {
+            item->discard();
+        }
+    }
+    m_pending = nullptr;
+    m_current = nullptr;
+    m_leaving = nullptr;
+    for (HostedItem *kept : qAsConst(m_kept)) {
+        kept->discard();
+    }
+    m_kept.clear();
+    if (shown) {
+        Q_EMIT currentItemChanged();
     }
 }
 
@@ -223,7 +243,7 @@ void ScreenHost::dropLeaving()
     left->jumpTo(0);
     left->item()->setVisible(false);
     if (left->hasFailed()) {
-        left->deleteLater();
+        left->discard();
         return;
     }
     m_kept.prepend(left);
@@ -233,7 +253,7 @@ void ScreenHost::dropLeaving()
 void ScreenHost::trimKept()
 {
     while (m_keep >= 0 && m_kept.size() > m_keep) {
-        m_kept.takeLast()->deleteLater();
+        m_kept.takeLast()->discard();
     }
 }
 

@@ -67,6 +67,13 @@ void HostedItem::load(const QVariantMap &properties, const std::function<void()>
     }
 }
 
+void HostedItem::discard()
+{
+    m_discarded = true;
+    jumpTo(m_position);
+    deleteLater();
+}
+
 QString HostedItem::id() const
 {
     return m_id;
@@ -142,11 +149,16 @@ void HostedItem::take(QQuickItem *item, const std::function<void()> &ready)
     m_item = item;
     QQmlEngine::setObjectOwnership(item, QQmlEngine::CppOwnership);
     item->setParent(this);
-    ready();
+    if (!m_discarded) {
+        ready();
+    }
 }
 
 void HostedItem::standIn(const LoadError &error, const std::function<void()> &ready)
 {
+    if (m_discarded) {
+        return;
+    }
     m_failed = true;
     m_host->target()->reportLoadError(error);
     QQmlComponent builtIn(qmlEngine(m_host),

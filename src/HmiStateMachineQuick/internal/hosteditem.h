@@ -19,7 +19,7 @@ class ItemMaker;
 
 /**
  * An item that a host shows, from the loading of its component to the end of its way out. A host
- * gets rid of it by deleteLater(): the item may be handling an event.
+ * gets rid of it by discard().
  */
 class HostedItem : public QObject
 {
@@ -43,6 +43,9 @@ public:
      * loaded is reported, and an error item made instead.
      */
     void load(const QVariantMap &properties, const std::function<void()> &ready);
+
+    /** Calls nobody any more, and is deleted later: the item may be handling an event. */
+    void discard();
 
     QString id() const;
 
@@ -87,6 +90,7 @@ private:
     std::function<void()> m_done;
     qreal m_position = 0;
     bool m_failed = false;
+    bool m_discarded = false;
 };
 
 } // namespace HmiStateMachine
