@@ -74,6 +74,7 @@ void PopupHost::presentPopup(const QString &popupId)
     HostedItem *popup = m_popups.value(popupId);
     if (!popup && m_leaving.contains(popupId)) {
         popup = m_leaving.take(popupId);
+        popup->jumpTo(popup->position()); // the way out ends here, and so does what came at its end
         m_popups.insert(popupId, popup);
         target()->reportPopupHidden(popupId);
     }
