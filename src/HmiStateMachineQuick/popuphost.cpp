@@ -226,7 +226,7 @@ void PopupHost::updateRows(int first, int last)
         }
         popup->setProperties(dataOf(entry.popupId));
         const qreal place = entry.covered ? 1 : 0;
-        if (popup->item() && !qFuzzyCompare(1 + popup->position(), 1 + place)) {
+        if (popup->item() && !qFuzzyCompare(1 + popup->goal(), 1 + place)) {
             popup->moveTo(place, [this] {
                 updateOrder();
                 busyChanged();

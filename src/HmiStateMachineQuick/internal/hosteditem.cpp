@@ -105,6 +105,7 @@ void HostedItem::moveTo(qreal to, const std::function<void()> &done)
 {
     m_animation->stop();
     m_done = done;
+    m_goal = to;
     if (m_host->duration() <= 0) {
         setPosition(to);
         endMove();
@@ -121,12 +122,18 @@ void HostedItem::jumpTo(qreal position)
 {
     m_done = nullptr;
     m_animation->stop();
+    m_goal = position;
     setPosition(position);
 }
 
 qreal HostedItem::position() const
 {
     return m_position;
+}
+
+qreal HostedItem::goal() const
+{
+    return m_goal;
 }
 
 void HostedItem::fit()

@@ -69,6 +69,9 @@ public:
 
     qreal position() const;
 
+    /** Where the move leads, or where it is when it does not move. */
+    qreal goal() const;
+
     /** Makes the item as large as the host. */
     void fit();
 
@@ -89,6 +92,7 @@ private:
     QVariantAnimation *m_animation;
     std::function<void()> m_done;
     qreal m_position = 0;
+    qreal m_goal = 0;
     bool m_failed = false;
     bool m_discarded = false;
 };
