@@ -196,9 +196,9 @@ int PopupHost::rowOf(const QString &popupId) const
 
 void PopupHost::appear(HostedItem *popup)
 {
-    popup->item()->setEnabled(true);
+    const bool covered = target()->shownPopups()->entry(rowOf(popup->id())).covered;
     updateOrder();
-    if (popup->position() > 0) {
+    if (popup->position() > 0 && !covered) {
         target()->reportPopupAnimationStarted(popup->id(), QuickViewStateTarget::AppearAnimation);
         popup->moveTo(0, [this] { busyChanged(); });
     }
