@@ -1,6 +1,7 @@
 #pragma once
 
 #include <QQmlEngine>
+#include <QQmlIncubationController>
 #include <QQuickItem>
 #include <QQuickWindow>
 #include <QStringList>
@@ -59,6 +60,22 @@ public:
 
 private:
     std::unique_ptr<QQuickItem> m_root;
+};
+
+/** Lets the scene go on with what it loads only when it is told to. */
+class StepwiseIncubation : public QQmlIncubationController
+{
+public:
+    explicit StepwiseIncubation(QQmlEngine &engine) : m_engine(engine)
+    {
+        engine.setIncubationController(this);
+    }
+    ~StepwiseIncubation() override { m_engine.setIncubationController(nullptr); }
+
+    void finish() { incubateFor(10000); }
+
+private:
+    QQmlEngine &m_engine;
 };
 
 /** Lets all that moves below @p host reach its end, or the middle of its way, now. */

@@ -16,6 +16,7 @@ function(hmi_add_quick_test name)
     set_tests_properties(${name} PROPERTIES ENVIRONMENT "${HMI_QUICK_TEST_ENVIRONMENT}")
 endfunction()
 
+hmi_add_quick_test(popuphost)
 hmi_add_quick_test(popuplistmodel)
 hmi_add_quick_test(quickviewstatetarget)
 hmi_add_quick_test(requests)

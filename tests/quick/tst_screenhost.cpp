@@ -12,7 +12,6 @@
 #include <HmiStateMachine/hmi/hmilayeredstate.h>
 #include <HmiStateMachine/hmi/hmiviewstate.h>
 
-#include <QQmlIncubationController>
 #include <QtTest>
 
 using namespace HmiStateMachine;
@@ -28,22 +27,6 @@ ScreenHost {
     ViewComponent { viewId: "Radio"; Item { objectName: "radio"; property int typed: 0 } }
     ViewComponent { viewId: "Map"; Item { objectName: "map" } }
 })";
-
-/** Lets the scene go on with what it loads only when it is told to. */
-class StepwiseIncubation : public QQmlIncubationController
-{
-public:
-    explicit StepwiseIncubation(QQmlEngine &engine) : m_engine(engine)
-    {
-        engine.setIncubationController(this);
-    }
-    ~StepwiseIncubation() override { m_engine.setIncubationController(nullptr); }
-
-    void finish() { incubateFor(10000); }
-
-private:
-    QQmlEngine &m_engine;
-};
 
 /** A flow of the views "Home", "Radio" and "Map" over a scene, which is made before it starts. */
 struct ScreenFlow : QuickFlow
