@@ -7,13 +7,10 @@ hmi_target_defaults(hmi_quick_test_support)
 target_include_directories(hmi_quick_test_support PUBLIC quick)
 target_link_libraries(hmi_quick_test_support PUBLIC hmi_test_support HmiStateMachine::Quick)
 
-# They draw into memory, so that no screen is needed.
-set(HMI_QUICK_TEST_ENVIRONMENT QT_QPA_PLATFORM=offscreen QT_QUICK_BACKEND=software)
-
 function(hmi_add_quick_test name)
     hmi_add_test(quick ${name})
     target_link_libraries(tst_${name} PRIVATE hmi_quick_test_support)
-    set_tests_properties(${name} PROPERTIES ENVIRONMENT "${HMI_QUICK_TEST_ENVIRONMENT}")
+    set_tests_properties(${name} PROPERTIES ENVIRONMENT "${HMI_OFFSCREEN_ENVIRONMENT}")
 endfunction()
 
 hmi_add_quick_test(popuphost)
@@ -73,4 +70,4 @@ elseif(HMISTATEMACHINE_SANITIZE)
     message(STATUS "Test of the module's description: off (HMISTATEMACHINE_SANITIZE)")
 endif()
 set_tests_properties(${quick_tool_tests} PROPERTIES
-    LABELS quick TIMEOUT 60 ENVIRONMENT "${HMI_QUICK_TEST_ENVIRONMENT}")
+    LABELS quick TIMEOUT 60 ENVIRONMENT "${HMI_OFFSCREEN_ENVIRONMENT}")

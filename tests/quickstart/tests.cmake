@@ -1,9 +1,3 @@
-# Scenes run without a display. What the platform plugin leaks is told from our leaks by whole stacks.
-set(HMI_OFFSCREEN_ENVIRONMENT
-    QT_QPA_PLATFORM=offscreen
-    QT_QUICK_BACKEND=software
-    LSAN_OPTIONS=fast_unwind_on_malloc=0:suppressions=${PROJECT_SOURCE_DIR}/tests/support/offscreen.supp)
-
 # The example that the way into Qt Quick is shown by: its scene and flow without its main().
 set(quickstart_dir ${PROJECT_SOURCE_DIR}/examples/quickstart-qml)
 hmi_add_test(quickstart quickstart)
@@ -17,13 +11,6 @@ target_link_libraries(tst_quickstart PRIVATE HmiStateMachine::Quick)
 set_tests_properties(quickstart PROPERTIES
     LABELS "quickstart;realtime"
     ENVIRONMENT "${HMI_OFFSCREEN_ENVIRONMENT}")
-
-find_program(HMI_TEST_QMLLINT NAMES qmllint)
-if(HMI_TEST_QMLLINT)
-    file(GLOB qml_files CONFIGURE_DEPENDS ${quickstart_dir}/*.qml)
-    add_test(NAME quickstart-qml-lint COMMAND ${HMI_TEST_QMLLINT} ${qml_files})
-    set_tests_properties(quickstart-qml-lint PROPERTIES LABELS quickstart TIMEOUT 30)
-endif()
 
 # So that it stays a quick start.
 add_test(NAME quickstart-qml-size COMMAND ${CMAKE_COMMAND}
