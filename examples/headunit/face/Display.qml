@@ -35,7 +35,6 @@ Rectangle {
         source: "views/%1.qml"
         keep: 0
         duration: 260
-        clip: true
         anchors {
             left: bezel.right
             right: parent.right
@@ -65,10 +64,19 @@ Rectangle {
         opacity: root.alone ? 0 : domainBar.enabled ? 1 : 0.3
     }
 
+    OfferBar {
+        objectName: "offer"
+        anchors.horizontalCenter: screenHost.horizontalCenter
+        anchors.bottom: domainBar.top
+        anchors.bottomMargin: 20
+        enabled: !root.alone
+    }
+
     PopupHost {
         id: popupHost
 
         objectName: "popupHost"
+        suppressedLayers: ViewTarget.popupsEnabled ? [] : ["Screens"]
         anchors {
             left: bezel.right
             right: parent.right
@@ -128,6 +136,13 @@ Rectangle {
             kind: 5
             source: "popups/OverlayPopup.qml"
         }
+    }
+
+    Hint {
+        objectName: "hint"
+        anchors.horizontalCenter: screenHost.horizontalCenter
+        anchors.bottom: domainBar.top
+        anchors.bottomMargin: 20
     }
 
     HardKeyBezel {

@@ -16,8 +16,9 @@ Page {
         { code: "sv", name: "Svenska", hint: "Välkommen" }
     ]
 
+    // There are no soft keys yet: it goes on to the edge of the display.
     Backdrop {
-        anchors.fill: parent
+        anchors { fill: parent; bottomMargin: -80 }
         horizon: 0.8
         strength: 0.7
     }

@@ -9,8 +9,9 @@ Page {
 
     Clock { id: clock }
 
+    // There are no soft keys yet: it goes on to the edge of the display.
     Backdrop {
-        anchors.fill: parent
+        anchors { fill: parent; bottomMargin: -80 }
         horizon: 0.8
         strength: 1.4
     }
