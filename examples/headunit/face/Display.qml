@@ -2,6 +2,7 @@ import QtQuick 2.15
 import HmiStateMachine 1.0
 import "."
 import "chrome"
+import "controls"
 
 /** The display of the car, 1280 x 720, with the keys that are built in beside it. */
 Rectangle {
@@ -28,6 +29,25 @@ Rectangle {
         onClicked: Requests.view("Home/Main")
     }
 
+    // Paints the map ahead of the first screen that shows it, behind what is to be seen.
+    Loader {
+        active: root.view === "" || root.view === "Home/Welcome" || root.view === "Home/Language"
+        sourceComponent: MapSheet {
+            id: sheet
+
+            width: city.width
+            height: city.height
+            city: MapCity {
+                id: city
+            }
+            colours: MapColours {
+                night: sheet.night
+            }
+            night: Preferences.nightMap
+            hurried: false
+        }
+    }
+
     ScreenHost {
         id: screenHost
 
@@ -35,6 +55,8 @@ Rectangle {
         source: "views/%1.qml"
         keep: 0
         duration: 260
+        // A screen without soft keys goes on below them.
+        clip: false
         anchors {
             left: bezel.right
             right: parent.right

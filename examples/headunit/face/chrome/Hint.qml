@@ -24,15 +24,10 @@ Rectangle {
     width: row.width + 56
     height: 72
     radius: 36
-    color: Theme.raised
+    color: Theme.pressed
     border.width: 1
-    border.color: Theme.line
-    opacity: time.running ? 1 : 0
-    visible: root.opacity > 0
-
-    Behavior on opacity {
-        NumberAnimation { duration: 180 }
-    }
+    border.color: Theme.disabled
+    visible: time.running
 
     Timer {
         id: time

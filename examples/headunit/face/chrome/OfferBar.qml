@@ -23,13 +23,8 @@ Rectangle {
     radius: 28
     color: Theme.raised
     border.width: 1
-    border.color: Theme.line
-    opacity: root.offered ? 1 : 0
-    visible: root.opacity > 0
-
-    Behavior on opacity {
-        NumberAnimation { duration: 180 }
-    }
+    border.color: Theme.disabled
+    visible: root.offered && ViewTarget.popupsEnabled
 
     MouseArea {
         anchors.fill: parent

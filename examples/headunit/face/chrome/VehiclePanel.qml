@@ -8,8 +8,8 @@ Rectangle {
     id: root
 
     readonly property var entries: [
-        { name: "incomingCall", icon: "ring_volume", text: "Call", event: "IncomingCall", data: { caller: "Anna Berg" } },
-        { name: "callBanner", icon: "phone_callback", text: "2nd call", popup: "phone/call", data: { caller: "Jonas Falk" } },
+        { name: "incomingCall", icon: "ring_volume", text: "Call", event: "IncomingCall", data: { caller: "Edda Quill" } },
+        { name: "callBanner", icon: "phone_callback", text: "2nd call", popup: "phone/call", data: { caller: "Jonas Averill" } },
         { name: "trafficAlert", icon: "campaign", text: "Alert", event: "TrafficAlert" },
         { name: "announcementDone", icon: "voice_over_off", text: "Read out", event: "AnnouncementDone" },
         { name: "traffic", icon: "traffic", text: "Jam", popup: "navigation/traffic", data: { minutes: 12, road: "Ring Road" } },

@@ -13,6 +13,18 @@ Shape {
     property real edgeThickness: 0
 
     readonly property var path: root.line.map(p => Qt.point(p.x * root.zoom, p.y * root.zoom))
+    readonly property rect bounds: root.boundsOf(root.path)
+
+    function boundsOf(path) {
+        const xs = path.map(p => p.x), ys = path.map(p => p.y)
+        const left = Math.min(...xs), top = Math.min(...ys)
+        return Qt.rect(left, top, Math.max(...xs) - left, Math.max(...ys) - top)
+    }
+
+    function isIn(window) {
+        return root.bounds.left < window.right && root.bounds.right > window.left
+            && root.bounds.top < window.bottom && root.bounds.bottom > window.top
+    }
 
     ShapePath {
         strokeColor: root.edge

@@ -51,8 +51,7 @@ Item {
         x: -Math.round(root.cameraX)
         y: -Math.round(root.cameraY)
 
-        MapGround {
-            id: ground
+        MapSheet {
             x: root.following ? 0 : Math.round(root.cameraX)
             y: root.following ? 0 : Math.round(root.cameraY)
             width: root.following ? plan.width * root.zoom : root.width
@@ -74,7 +73,11 @@ Item {
         }
         Loader {
             active: root.trafficShown
-            sourceComponent: MapTraffic { city: plan; zoom: root.zoom }
+            sourceComponent: MapTraffic {
+                city: plan
+                zoom: root.zoom
+                window: Qt.rect(root.cameraX, root.cameraY, root.width, root.height)
+            }
         }
         MapLabels {
             visible: root.namesShown

@@ -7,6 +7,7 @@ Item {
 
     property MapCity city
     property real zoom: 1
+    property rect window ///< what is to be seen of the map
 
     // A street, from and to which of its samples, 0 flowing .. 2 jammed, and on which side.
     readonly property var stretches: [
@@ -23,7 +24,10 @@ Item {
     Repeater {
         model: root.stretches
 
+        // The software renderer does not clip a shape that is outside altogether.
         MapLine {
+            id: flowLine
+            visible: flowLine.isIn(root.window)
             zoom: root.zoom
             thickness: modelData[3] === 0 ? 4.5 : 6.5
             colour: root.flow[modelData[3]]

@@ -2,17 +2,24 @@ import QtQuick 2.15
 import HmiStateMachine 1.0
 import ".."
 import "../controls"
+import "../views/Phone"
 
 /** Somebody calls while something else is on the screen. */
 PopupFrame {
     id: root
 
-    readonly property string caller: root.read("caller", "Unknown caller")
+    readonly property string told: root.read("caller", "")
+    readonly property bool known: root.told !== "" && root.told !== "unknown"
+    readonly property string caller: root.known ? book.caller(root.told).name : "Unknown caller"
 
     stateName: "phone/call"
     modal: true
     panelWidth: 760
     panelHeight: 432
+
+    ContactBook {
+        id: book
+    }
 
     CallerPicture {
         id: picture

@@ -7,19 +7,21 @@ import "../controls"
 PopupFrame {
     id: root
 
+    readonly property int limit: Number(root.read("limit", 130))
+
     stripe: Theme.warning
     surface: Theme.raised
     panelWidth: 520
     panelHeight: 152
     panelX: root.width - panelWidth - Theme.margin
-    panelY: 72
+    panelY: 136
 
     SpeedSign {
         id: sign
 
         x: 34
         anchors.verticalCenter: parent.verticalCenter
-        limit: Number(root.read("limit", 130))
+        limit: root.limit
     }
 
     Column {
@@ -36,7 +38,7 @@ PopupFrame {
         }
 
         Label {
-            text: Vehicle.speed + " km/h"
+            text: Vehicle.speed > root.limit ? Vehicle.speed + " km/h" : "Slow down"
             kind: Label.Title
         }
     }

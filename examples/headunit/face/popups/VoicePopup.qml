@@ -26,7 +26,7 @@ OverlayPopup {
 
         Label {
             width: parent.width
-            text: "“Navigate home”   “Call Anna”   “Play music”"
+            text: "“Navigate home”   “Call Ann”   “Play music”"
             kind: Label.Small
             muted: true
         }

@@ -62,10 +62,7 @@ Card {
         anchors { left: parent.left; right: parent.right; top: top.bottom; bottom: bottom.top; leftMargin: 1; rightMargin: 1 }
         night: Preferences.nightMap
         routeShown: root.guided
-        zoom: 0.9
-        // A still picture: to paint all of the city would hold up the way to this screen.
-        following: false
-        centre: Qt.point(map.route.position.x, map.route.position.y + 34)
+        anchor: Qt.point(0.5, 0.45)
     }
     Item {
         id: bottom
