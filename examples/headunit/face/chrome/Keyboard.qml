@@ -36,7 +36,8 @@ Item {
 
     function openDomain(index) {
         if (index < ViewTarget.domains.length) {
-            Requests.view(ViewTarget.domains[index]);
+            const domain = ViewTarget.domains[index];
+            Requests.view(domain === "Home" ? "Home/Main" : domain);
         }
     }
 

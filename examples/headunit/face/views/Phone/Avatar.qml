@@ -7,7 +7,7 @@ Rectangle {
 
     property string name
     property color tint: "#4a5968"
-    readonly property string initials: root.name.split(" ").slice(0, 2).map(word => word.charAt(0)).join("")
+    readonly property string initials: root.name.split(" ").slice(0, 2).map(word => word.charAt(0)).join("").toUpperCase()
 
     width: 60
     height: root.width
