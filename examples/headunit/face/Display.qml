@@ -29,8 +29,9 @@ Rectangle {
         onClicked: Requests.view("Home/Main")
     }
 
-    // Paints the map ahead of the first screen that shows it, behind what is to be seen.
+    // Paints the map ahead of the first screen that shows it, beside what is to be seen.
     Loader {
+        x: root.width
         active: root.view === "" || root.view === "Home/Welcome" || root.view === "Home/Language"
         sourceComponent: MapSheet {
             id: sheet
@@ -94,69 +95,15 @@ Rectangle {
         enabled: !root.alone
     }
 
-    PopupHost {
+    Popups {
         id: popupHost
 
         objectName: "popupHost"
-        suppressedLayers: ViewTarget.popupsEnabled ? [] : ["Screens"]
         anchors {
             left: bezel.right
             right: parent.right
             top: parent.top
             bottom: parent.bottom
-        }
-
-        PopupComponent {
-            popupId: "CallBanner"
-            source: "popups/CallBanner.qml"
-        }
-        PopupComponent {
-            popupId: "FuelWarning"
-            source: "popups/FuelWarning.qml"
-        }
-        PopupComponent {
-            popupId: "FaultScreen"
-            source: "popups/FaultScreen.qml"
-        }
-        PopupComponent {
-            popupId: "navigation/traffic"
-            source: "popups/TrafficPopup.qml"
-        }
-        PopupComponent {
-            popupId: "system/update"
-            source: "popups/UpdatePopup.qml"
-        }
-        PopupComponent {
-            popupId: "system/voice"
-            source: "popups/VoicePopup.qml"
-        }
-        PopupComponent {
-            popupId: "media/volume"
-            source: "popups/VolumePopup.qml"
-        }
-        PopupComponent {
-            popupId: "car/speed"
-            source: "popups/SpeedPopup.qml"
-        }
-        PopupComponent {
-            popupId: "car/parking"
-            source: "popups/ParkingPopup.qml"
-        }
-        PopupComponent {
-            kind: 2
-            source: "popups/NotePopup.qml"
-        }
-        PopupComponent {
-            kind: 3
-            source: "popups/QuestionPopup.qml"
-        }
-        PopupComponent {
-            kind: 4
-            source: "popups/WarningPopup.qml"
-        }
-        PopupComponent {
-            kind: 5
-            source: "popups/OverlayPopup.qml"
         }
     }
 
