@@ -15,7 +15,7 @@ PanelSection {
     PanelText {
         visible: root.stack.length === 0
         height: 23
-        text: "The stack is empty"
+        text: ViewTarget.backPossible ? "Nothing lies behind it" : "The stack is empty"
         color: Theme.disabled
     }
 
