@@ -3,6 +3,7 @@ import HmiStateMachine 1.0
 import ".."
 import "../controls"
 import "../views/Phone"
+import "../views/Phone/chosen.js" as Chosen
 
 /** Somebody calls while something else is on the screen. */
 PopupFrame {
@@ -26,7 +27,7 @@ PopupFrame {
 
         anchors.horizontalCenter: parent.horizontalCenter
         y: 40
-        caller: root.caller
+        caller: root.known ? root.caller : ""
     }
 
     Column {
@@ -80,6 +81,7 @@ PopupFrame {
             icon: "phone"
             text: "Accept"
             onClicked: {
+                Chosen.caller = root.caller;
                 Requests.view("Phone/InCall");
                 root.dismiss();
             }

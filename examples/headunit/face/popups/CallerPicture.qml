@@ -6,7 +6,7 @@ import "../controls"
 Item {
     id: root
 
-    property string caller
+    property string caller ///< empty when nobody knows
     readonly property string initials: root.caller.split(" ").map(word => word.charAt(0)).join("").slice(0, 2)
 
     width: 116
@@ -51,6 +51,14 @@ Item {
         height: 104
         radius: 52
         color: Qt.darker(Theme.positive, 2.6)
+
+        Icon {
+            anchors.centerIn: parent
+            visible: root.caller === ""
+            name: "person"
+            size: 64
+            color: Theme.positive
+        }
 
         Label {
             anchors.centerIn: parent

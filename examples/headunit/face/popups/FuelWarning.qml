@@ -22,7 +22,7 @@ WarningPopup {
 
     ProgressBar {
         width: parent.width
-        height: 12
+        height: root.known ? 12 : 0
         visible: root.known
         value: root.percent / 100
         barColor: Theme.warning

@@ -16,6 +16,7 @@ Page {
 
     function dial(number) {
         Chosen.name = root.contact.name
+        Chosen.caller = root.contact.name
         Requests.event("Dial", { number: number })
     }
 

@@ -10,7 +10,7 @@ Page {
 
     readonly property var sent: root.read(root.viewData, "eventData", undefined)
     readonly property string told: root.read(root.activationData, "caller", root.read(root.sent, "caller", ""))
-    readonly property var caller: book.caller(root.told === "" ? Chosen.name : root.told)
+    readonly property var caller: book.caller(root.told || Chosen.caller || Chosen.name)
 
     title: "Call"
 

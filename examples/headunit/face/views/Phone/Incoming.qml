@@ -12,10 +12,7 @@ Page {
     readonly property var caller: book.caller(root.told === "" ? "Unknown caller" : root.told)
 
     title: "Incoming call"
-    onToldChanged: {
-        if (root.told !== "")
-            Chosen.name = root.told
-    }
+    onCallerChanged: Chosen.caller = root.caller.name
 
     ContactBook { id: book }
 
