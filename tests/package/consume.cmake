@@ -1,7 +1,8 @@
 # Uses the library as another project does, in WORK_DIR, which is made anew.
 #
 # BUILD_DIR: install this build. STATIC, PLATFORM_LOGGING: build the library so first, and install
-# that. SUBPROJECT: add it as a subfolder instead.
+# that. SUBPROJECT: add it as a subfolder instead. QUICK: with the view layer for Qt Quick; without,
+# Qt Quick is hidden. VIEWER_SOURCE: a program that loads the QML module's plugin, too.
 
 function(run)
     execute_process(COMMAND ${ARGN} RESULT_VARIABLE result OUTPUT_VARIABLE output
@@ -50,10 +51,20 @@ else()
     set(library -DCMAKE_PREFIX_PATH=${prefix} -DVERSION=${VERSION})
 endif()
 
-run(${configure} -S ${CMAKE_CURRENT_LIST_DIR}/consumer -B ${WORK_DIR}/consumer
-    ${library} ${platform_logging})
+if(QUICK)
+    set(consumer quickconsumer)
+    set(quick -DVIEWER_SOURCE=${VIEWER_SOURCE})
+else()
+    set(consumer consumer)
+    set(quick -DCMAKE_DISABLE_FIND_PACKAGE_Qt5Qml=ON -DCMAKE_DISABLE_FIND_PACKAGE_Qt5Quick=ON)
+endif()
+run(${configure} -S ${CMAKE_CURRENT_LIST_DIR}/${consumer} -B ${WORK_DIR}/consumer
+    ${library} ${platform_logging} ${quick})
 if(SUBPROJECT)
     expect("Logging: the stand-in in platform/standin \\(HMISTATEMACHINE_PLATFORM_LOGGING=OFF\\)")
+    if(NOT QUICK)
+        expect("View layer for Qt Quick: OFF \\(HMISTATEMACHINE_BUILD_QUICK=AUTO\\)")
+    endif()
 endif()
 run(${CMAKE_COMMAND} --build ${WORK_DIR}/consumer)
 if(SUBPROJECT AND EXISTS ${WORK_DIR}/consumer/library/tests)
@@ -61,4 +72,12 @@ if(SUBPROJECT AND EXISTS ${WORK_DIR}/consumer/library/tests)
 endif()
 set(ENV{QT_LOGGING_RULES} "*.debug=false")
 run(${WORK_DIR}/consumer/consumer)
-expect("^the radio is shown\n$")
+if(QUICK)
+    expect("the radio is shown\n") # and the warning that brings the banner
+else()
+    expect("^the radio is shown\n$")
+endif()
+if(VIEWER_SOURCE)
+    run(${CMAKE_COMMAND} --build ${WORK_DIR}/consumer --target view)
+    expect("a scene with the effect 2\n")
+endif()

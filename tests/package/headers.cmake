@@ -1,4 +1,4 @@
-# Compiles each of HEADERS as the only include of a source file, in the strictest settings that an
+# Compiles each of HEADERS, which lie in FOLDER, as the only include of a source file, in the strictest settings that an
 # application may choose.
 
 set(options -std=c++${STANDARD} -fsyntax-only -fPIC -x c++
@@ -18,10 +18,10 @@ if(count LESS 2)
 endif()
 set(failures "")
 get_filename_component(compiler_name ${COMPILER} NAME)
-set(source_file header-${compiler_name}-${STANDARD}.cpp.in)
+set(source_file header-${FOLDER}-${compiler_name}-${STANDARD}.cpp.in)
 foreach(header IN LISTS HEADERS)
     # Twice: a header guards itself.
-    set(source "#include <HmiStateMachine/${header}>\n#include <HmiStateMachine/${header}>\n")
+    set(source "#include <${FOLDER}/${header}>\n#include <${FOLDER}/${header}>\n")
     file(WRITE ${source_file} "${source}")
     execute_process(
         COMMAND ${COMPILER} ${options} -

@@ -1,0 +1,59 @@
+#include <HmiStateMachine/hmi/hmiviewstate.h>
+#include <HmiStateMachine/named/statemachine.h>
+#include <HmiStateMachineQuick/quickviewstatetarget.h>
+#include <HmiStateMachineQuick/requests.h>
+#include <HmiStateMachineQuick/screenhost.h>
+
+#include <QGuiApplication>
+#include <QQmlComponent>
+#include <QQmlEngine>
+
+#include <cstdio>
+#include <memory>
+
+using namespace HmiStateMachine;
+
+namespace {
+
+const char scene[] = R"(
+import QtQuick 2.15
+import HmiStateMachine 1.0
+
+ScreenHost {
+    duration: 0
+    ViewComponent { viewId: "Home"; Item { } }
+    ViewComponent { viewId: "Radio"; Item { objectName: "the radio is shown" } }
+}
+)";
+
+} // namespace
+
+int main(int argc, char **argv)
+{
+    QGuiApplication app(argc, argv);
+    QuickViewStateTarget target;
+    StateMachine *machine = StateMachine::instance();
+    auto *home = new HmiViewState("Home", machine);
+    new HmiViewState("Radio", machine);
+    machine->setInitialState(home);
+
+    // The component has its resources in a static library too.
+    QQmlEngine engine;
+    QQmlComponent component(&engine);
+    component.setData(scene, QUrl("file:///Scene.qml"));
+    const std::unique_ptr<QObject> root(component.create());
+    const auto *host = qobject_cast<ScreenHost *>(root.get());
+    if (!host) {
+        std::fputs(qPrintable(component.errorString()), stderr);
+        return 1;
+    }
+    machine->start();
+    QCoreApplication::sendPostedEvents();
+    target.requests()->view("Radio");
+    QCoreApplication::sendPostedEvents();
+
+    std::puts(qPrintable(host->currentItem()->objectName()));
+    target.requests()->setChecksIds(true);
+    target.requests()->view("Nowhere"); // shows the banner
+    return host->findChild<QQuickItem *>("warningBanner") ? 0 : 1;
+}
