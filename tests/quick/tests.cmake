@@ -46,10 +46,11 @@ if(TARGET hmistatemachineplugin)
         HMI_QUICK_VIEWER="$<TARGET_FILE:hmi_quick_viewer>"
         HMI_QML_DIR="${HMISTATEMACHINE_QML_DIR}")
 
+    # What the head unit registers itself has no description for the tool to read.
     add_test(NAME quick-qmllint-unqualified COMMAND ${CMAKE_COMMAND}
         -D LINT=${HMI_TEST_QMLLINT}
         -D UNQUALIFIED=ON
-        "-DDIRS=${qml_dirs}"
+        "-DDIRS=${PROJECT_SOURCE_DIR}/src/HmiStateMachineQuick;${PROJECT_SOURCE_DIR}/examples/quickstart-qml"
         "-DIMPORT_DIRS=${qt_qml_dir};${HMISTATEMACHINE_QML_DIR}"
         -P ${CMAKE_CURRENT_SOURCE_DIR}/quick/qmllint.cmake)
     list(APPEND quick_tool_tests quick-qmllint-unqualified)
