@@ -221,9 +221,14 @@ void tst_PopupListModel::anUpdateOfAnUnknownPopupDoesNothing()
 void tst_PopupListModel::aPopupIsRemoved()
 {
     Popups popups;
+    QSignalSpy removed(&popups.model, &QAbstractItemModel::rowsRemoved);
+    QVERIFY(removed.isValid());
 
     QVERIFY(popups.model.remove("Call"));
 
+    QCOMPARE(removed.size(), 1);
+    QCOMPARE(removed.first().at(1).toInt(), 1);
+    QCOMPARE(removed.first().at(2).toInt(), 1);
     QCOMPARE(idsIn(popups.model), QStringList({"Fuel", "Oil"}));
     QCOMPARE(popups.counts.size(), 1);
 }

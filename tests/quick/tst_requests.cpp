@@ -61,6 +61,7 @@ private Q_SLOTS:
     void aViewIsRequested();
     void anObjectLiteralArrivesAsAMap_data();
     void anObjectLiteralArrivesAsAMap();
+    void aScriptValueArrivesAsAMapToo();
     void backLeadsOneStepUnlessToldOtherwise_data();
     void backLeadsOneStepUnlessToldOtherwise();
     void aDepthOutOfRangeIsAWarning_data();
@@ -159,6 +160,19 @@ void tst_Requests::anObjectLiteralArrivesAsAMap()
              QVariantList({QVariantList({"view", "Radio", data}),
                            QVariantList({"popup", "FuelView", data}),
                            QVariantList({"event", "tune", data})}));
+}
+
+void tst_Requests::aScriptValueArrivesAsAMapToo()
+{
+    RequestFlow flow(messages());
+    flow.start();
+    QJSValue value = flow.scene.engine.newObject(); // as signals of a scene hand over
+    value.setProperty("track", 7);
+
+    flow.requests->view("Radio", QVariant::fromValue(value));
+    settle();
+
+    QCOMPARE(flow.target->viewData().value("eventData"), QVariant(QVariantMap({{"track", 7}})));
 }
 
 void tst_Requests::backLeadsOneStepUnlessToldOtherwise_data()
