@@ -172,8 +172,8 @@ void HostedItem::standIn(const LoadError &error, const std::function<void()> &re
                           QUrl(QStringLiteral("qrc:/HmiStateMachineQuick/ErrorCard.qml")));
     QQmlComponent *component = m_host->errorComponent() ? m_host->errorComponent() : &builtIn;
     QQmlContext *declared = component->creationContext();
-    auto *item = qobject_cast<QQuickItem *>(
-        component->beginCreate(declared ? declared : qmlContext(m_host)));
+    QObject *object = component->beginCreate(declared ? declared : qmlContext(m_host));
+    auto *item = qobject_cast<QQuickItem *>(object);
     if (!item) {
         qCWarning(hmistatemachinequick, "no error item: %s",
                   qUtf8Printable(component->errorString()));
@@ -185,6 +185,9 @@ void HostedItem::standIn(const LoadError &error, const std::function<void()> &re
              {QStringLiteral("line"), error.line},
              {QStringLiteral("text"), error.text}});
     component->completeCreate();
+    if (object != item) {
+        delete object;
+    }
     take(item, ready);
 }
 
