@@ -665,6 +665,7 @@ void tst_PopupHost::aPopupThatIsCoveredWhileItLoadsStaysOut()
     incubation.finish();
     flow.finish();
     QCOMPARE(flow.itemsThere(), QStringList({"fuel", "call+"}));
+    QCOMPARE(positionOf(flow.item("fuel")), 1.0);
 
     flow.close(flow.call);
     flow.finish();

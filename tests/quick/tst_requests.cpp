@@ -172,7 +172,9 @@ void tst_Requests::aScriptValueArrivesAsAMapToo()
     flow.requests->view("Radio", QVariant::fromValue(value));
     settle();
 
-    QCOMPARE(flow.target->viewData().value("eventData"), QVariant(QVariantMap({{"track", 7}})));
+    const QVariant data = flow.target->viewData().value("eventData");
+    QCOMPARE(data.userType(), int(QMetaType::QVariantMap)); // equal values may differ in it
+    QCOMPARE(data, QVariant(QVariantMap({{"track", 7}})));
 }
 
 void tst_Requests::backLeadsOneStepUnlessToldOtherwise_data()
