@@ -25,7 +25,8 @@ struct HMISTATEMACHINEQUICK_EXPORT PopupEntry
  * A list of popups for QML, the lowest first. Written by QuickViewStateTarget alone.
  *
  * Roles: "popupId", "kind", "popupData", "layer", "remainingTime", "totalTime" (both in
- * milliseconds, 0 when there is none) and "covered".
+ * milliseconds, 0 when there is none) and "covered". A delegate that is an Item has a property
+ * "layer" of its own: there it is model.layer.
  */
 class HMISTATEMACHINEQUICK_EXPORT PopupListModel : public QAbstractListModel
 {
