@@ -1,10 +1,13 @@
 # hmi_add_output_test(<name> COMMAND <command> [<argument>...] EXPECTED <file>
-#                     [EXIT_CODE <code>] [STREAM stdout|stderr] [DIRECTORY <dir>] [LABELS <label>...])
+#                     [EXIT_CODE <code>] [STREAM stdout|stderr] [DIRECTORY <dir>] [LABELS <label>...]
+#                     [LAUNCHER <command> [<argument>...]])
 #
 # A test that runs a command and compares all that it writes, and its exit code, with a file. What
-# it wrote is left beside the build as <name>.actual when it differs.
+# it wrote is left beside the build as <name>.actual when it differs. A launcher is what the whole
+# test is run through, xvfb-run say; what that writes itself is not compared.
 function(hmi_add_output_test name)
-    cmake_parse_arguments(PARSE_ARGV 1 arg "" "EXPECTED;EXIT_CODE;STREAM;DIRECTORY" "COMMAND;LABELS")
+    cmake_parse_arguments(PARSE_ARGV 1 arg "" "EXPECTED;EXIT_CODE;STREAM;DIRECTORY"
+        "COMMAND;LABELS;LAUNCHER")
     list(POP_FRONT arg_COMMAND target)
     if(NOT arg_EXIT_CODE)
         set(arg_EXIT_CODE 0)
@@ -16,7 +19,7 @@ function(hmi_add_output_test name)
         set(arg_DIRECTORY ${CMAKE_CURRENT_SOURCE_DIR})
     endif()
     add_test(NAME ${name}
-        COMMAND ${CMAKE_COMMAND}
+        COMMAND ${arg_LAUNCHER} ${CMAKE_COMMAND}
             -DEXPECTED=${arg_EXPECTED}
             -DEXIT_CODE=${arg_EXIT_CODE}
             -DSTREAM=${arg_STREAM}
