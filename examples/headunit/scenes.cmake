@@ -97,3 +97,7 @@ target_compile_definitions(tst_screenshots PRIVATE
     SCENARIO="${scene_tests_dir}/screenshots.scenario")
 add_test(NAME screenshots COMMAND ${on_a_display} $<TARGET_FILE:tst_screenshots>)
 hmi_test_on_a_display(screenshots)
+
+hmi_add_scene_program(tst_flowpause)
+add_test(NAME flowpause COMMAND tst_flowpause)
+set_tests_properties(flowpause PROPERTIES LABELS "scene;realtime" TIMEOUT 30)

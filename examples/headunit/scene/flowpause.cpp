@@ -3,15 +3,28 @@
 #include <QAbstractEventDispatcher>
 #include <QTimer>
 
-#include <utility>
-
 namespace headunit {
 
 namespace {
 
+const QString restName = QStringLiteral("restOfInterval");
+
 QAbstractEventDispatcher *dispatcher()
 {
     return QAbstractEventDispatcher::instance();
+}
+
+// What a timer was started with; -1 while it is held. Its id does not tell whether it has been
+// started anew: one that is given up is the next to be given away.
+int registeredInterval(QTimer *timer)
+{
+    const auto registered = dispatcher()->registeredTimers(timer);
+    for (const auto &info : registered) {
+        if (info.timerId == timer->timerId()) {
+            return info.interval;
+        }
+    }
+    return -1;
 }
 
 // The timer itself does not notice, so its interval stays what it was.
@@ -41,7 +54,8 @@ void FlowPause::end()
     m_held = false;
     const auto timers = runningTimers();
     for (QTimer *timer : timers) {
-        if (m_remaining.contains(timer->timerId())) {
+        const bool isHeld = registeredInterval(timer) < 0; // not stopped and started meanwhile
+        if (isHeld && m_remaining.contains(timer->timerId())) {
             resume(timer, m_remaining.value(timer->timerId()));
         }
     }
@@ -53,10 +67,10 @@ void FlowPause::beginAgain()
         return;
     }
     m_held = true;
-    const auto before = std::exchange(m_remaining, {});
+    m_remaining.clear();
     const auto timers = runningTimers();
     for (QTimer *timer : timers) {
-        hold(timer, before.value(timer->timerId(), timer->interval()));
+        hold(timer, registeredInterval(timer)); // the rest, when it is one of the last pause's
     }
 }
 
@@ -83,10 +97,12 @@ void FlowPause::hold(QTimer *timer, int remaining)
 void FlowPause::resume(QTimer *timer, int remaining)
 {
     dispatcher()->registerTimer(timer->timerId(), remaining, timer->timerType(), timer);
-    if (timer->isSingleShot() || remaining == timer->interval()) {
+    if (timer->isSingleShot() || remaining == timer->interval()
+        || timer->findChild<QObject *>(restName, Qt::FindDirectChildrenOnly)) {
         return;
     }
     auto *once = new QObject(timer);
+    once->setObjectName(restName);
     const int id = timer->timerId();
     QObject::connect(timer, &QTimer::timeout, once, [timer, once, id] {
         if (timer->timerId() == id) {

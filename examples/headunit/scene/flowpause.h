@@ -36,7 +36,7 @@ private:
     QList<QTimer *> runningTimers() const;
 
     QList<QObject *> m_owners;
-    QHash<int, int> m_remaining; // by timer id, which is another one after each start
+    QHash<int, int> m_remaining; // by timer id
     bool m_held = false;
 };
 
