@@ -9,7 +9,7 @@ using namespace HmiStateMachine;
 
 namespace headunit {
 
-void allowOnlyWhile(std::function<bool()> condition, HmiTransition *transition)
+void allowOnlyWhile(std::function<bool()> condition, GuardedTransition *transition)
 {
     QObject::connect(transition, &GuardedTransition::transitionTest, transition,
                      [condition, transition] {

@@ -3,6 +3,7 @@
 #include <functional>
 
 namespace HmiStateMachine {
+class GuardedTransition;
 class HmiTransition;
 class NamedState;
 } // namespace HmiStateMachine
@@ -15,7 +16,8 @@ class Vehicle;
  * Lets @p transition, which allows by default, pass only while @p condition holds. Several guards
  * may be set: a refusal is final.
  */
-void allowOnlyWhile(std::function<bool()> condition, HmiStateMachine::HmiTransition *transition);
+void allowOnlyWhile(std::function<bool()> condition,
+                    HmiStateMachine::GuardedTransition *transition);
 
 /** A request from any screen for a view that is active already would leave it and enter it anew. */
 void refuseWhileActive(HmiStateMachine::NamedState *target,

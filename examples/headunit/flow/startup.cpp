@@ -1,6 +1,7 @@
 #include "startup.h"
 
 #include "building.h"
+#include "guards.h"
 #include "vehicle.h"
 #include "viewlayer.h"
 
@@ -21,14 +22,23 @@ void welcomeWhoHasChosen(HmiConditionalState *start, const Vehicle *vehicle)
 {
     auto *pass = start->findChild<GuardedTransition *>();
     QObject::connect(start, &HmiConditionalState::conditionTest, start, [pass, vehicle] {
-        if (vehicle->isFirstStart()) {
+        if (vehicle->isFirstStart() || vehicle->ready()) {
             pass->setAllowTransition(false);
         }
     });
     start->setTargetState(state("Home/Welcome"));
 }
 
-// What was forbidden above leads on here: of a state's transitions the first that may is taken.
+// What was forbidden above leads on below: of a state's transitions the first that may is taken.
+// Whoever asks for the domain while the car is in use comes home, and is not welcomed again.
+void goHomeOnceReady(HmiConditionalState *start, const Vehicle *vehicle)
+{
+    auto *home = new GuardedTransition(start);
+    home->setAllowTransitionDefault(true);
+    allowOnlyWhile([vehicle] { return vehicle->ready(); }, home);
+    home->setTargetState(state("Home/Main"));
+}
+
 void askOtherwise(HmiConditionalState *start)
 {
     auto *ask = new GuardedTransition(start);
@@ -36,14 +46,19 @@ void askOtherwise(HmiConditionalState *start)
     ask->setTargetState(state("Home/Language"));
 }
 
-void goOnWithLanguage(ViewLayer *viewLayer)
+// The systems may have come up while the driver was choosing; the welcome screen waits for that.
+void goOnWithLanguage(const Vehicle *vehicle, ViewLayer *viewLayer)
 {
     HmiViewState *language = view("Home/Language");
     language->setIndirectViewTransitionsBlocked(true);
-    HmiTransition *chosen = onEvent("LanguageChosen", language, "Home/Welcome");
-    QObject::connect(chosen, &QAbstractTransition::triggered, viewLayer, [chosen, viewLayer] {
-        viewLayer->showStatus("language " + chosen->transitionData().toString());
-    });
+    HmiTransition *home = onEvent("LanguageChosen", language, "Home/Main");
+    allowOnlyWhile([vehicle] { return vehicle->ready(); }, home);
+    HmiTransition *welcome = onEvent("LanguageChosen", language, "Home/Welcome");
+    for (HmiTransition *chosen : {home, welcome}) {
+        QObject::connect(chosen, &QAbstractTransition::triggered, viewLayer, [chosen, viewLayer] {
+            viewLayer->showStatus("language " + chosen->transitionData().toString());
+        });
+    }
 }
 
 } // namespace
@@ -58,8 +73,9 @@ void addStartUpTransitions(const Surroundings &surroundings)
 {
     auto *start = qobject_cast<HmiConditionalState *>(state("Home/Start"));
     welcomeWhoHasChosen(start, surroundings.vehicle);
+    goHomeOnceReady(start, surroundings.vehicle);
     askOtherwise(start);
-    goOnWithLanguage(surroundings.viewLayer);
+    goOnWithLanguage(surroundings.vehicle, surroundings.viewLayer);
 }
 
 } // namespace headunit
