@@ -101,3 +101,7 @@ hmi_test_on_a_display(screenshots)
 hmi_add_scene_program(tst_flowpause)
 add_test(NAME flowpause COMMAND tst_flowpause)
 set_tests_properties(flowpause PROPERTIES LABELS "scene;realtime" TIMEOUT 30)
+
+hmi_add_scene_program(tst_sceneinput)
+add_test(NAME sceneinput COMMAND ${on_a_display} $<TARGET_FILE:tst_sceneinput>)
+hmi_test_on_a_display(sceneinput)
