@@ -16,7 +16,7 @@ file(CHMOD ${runtime_dir} DIRECTORY_PERMISSIONS OWNER_READ OWNER_WRITE OWNER_EXE
 set(scene_environment
     QT_QUICK_BACKEND=software
     XDG_RUNTIME_DIR=${runtime_dir}
-    LSAN_OPTIONS=suppressions=${scene_tests_dir}/leaks.supp:print_suppressions=0)
+    LSAN_OPTIONS=fast_unwind_on_malloc=0:suppressions=${scene_tests_dir}/leaks.supp)
 set(no_display DISPLAY=unset: WAYLAND_DISPLAY=unset: QT_QPA_PLATFORM=unset:)
 
 # Their displays are started one after the other: two at once may choose the same number.
@@ -105,3 +105,9 @@ set_tests_properties(flowpause PROPERTIES LABELS "scene;realtime" TIMEOUT 30)
 hmi_add_scene_program(tst_sceneinput)
 add_test(NAME sceneinput COMMAND ${on_a_display} $<TARGET_FILE:tst_sceneinput>)
 hmi_test_on_a_display(sceneinput)
+
+hmi_add_scene_program(tst_scenegrowth)
+target_compile_definitions(tst_scenegrowth PRIVATE ROUND="${scene_tests_dir}/growth.scenario")
+add_test(NAME scenegrowth COMMAND ${on_a_display} $<TARGET_FILE:tst_scenegrowth>)
+hmi_test_on_a_display(scenegrowth)
+set_tests_properties(scenegrowth PROPERTIES TIMEOUT 900)
