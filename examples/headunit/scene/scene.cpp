@@ -41,7 +41,9 @@ void warnOfMissingFonts()
 bool waitUntilExposed(const QQuickWindow *window)
 {
     QEventLoop loop;
-    QTimer::singleShot(openingMs, &loop, &QEventLoop::quit);
+    QTimer timeout; // goes with the loop, unlike one that is started by the static function
+    QObject::connect(&timeout, &QTimer::timeout, &loop, &QEventLoop::quit);
+    timeout.start(openingMs);
     QObject::connect(window, &QQuickWindow::frameSwapped, &loop, &QEventLoop::quit);
     loop.exec();
     return window->isExposed();
