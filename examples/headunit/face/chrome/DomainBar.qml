@@ -33,8 +33,7 @@ Rectangle {
                 height: row.height
                 domain: model.modelData
                 current: model.modelData === ViewTarget.activeDomainName
-                // The first view of this domain is the welcome, which is there for the start only.
-                onClicked: Requests.view(model.modelData === "Home" ? "Home/Main" : model.modelData)
+                onClicked: Requests.view(model.modelData)
             }
         }
     }

@@ -36,8 +36,7 @@ Item {
 
     function openDomain(index) {
         if (index < ViewTarget.domains.length) {
-            const domain = ViewTarget.domains[index];
-            Requests.view(domain === "Home" ? "Home/Main" : domain);
+            Requests.view(ViewTarget.domains[index]);
         }
     }
 
