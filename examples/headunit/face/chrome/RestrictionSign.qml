@@ -2,11 +2,13 @@ import QtQuick 2.15
 import ".."
 import "../controls"
 
-/** Whether the car is too fast for the driver to watch and type. */
+/** Whether the car is too fast for the driver to watch and type; a touch asks for the other. */
 Column {
     id: root
 
     property bool active: false
+
+    signal clicked
 
     width: 68
     spacing: 4
@@ -22,5 +24,9 @@ Column {
         anchors.horizontalCenter: parent.horizontalCenter
         text: root.active ? "Driving" : "Free"
         color: root.active ? Theme.warning : Theme.secondary
+    }
+
+    TapHandler {
+        onTapped: root.clicked()
     }
 }

@@ -91,6 +91,7 @@ Rectangle {
             objectName: "restriction"
             anchors.verticalCenter: parent.verticalCenter
             active: Vehicle.moving
+            onClicked: Vehicle.speed = Vehicle.moving ? 0 : 50
         }
     }
 

@@ -97,6 +97,7 @@ private Q_SLOTS:
     void videoIsRefusedWhileDriving();
     void hintGoesWithTheNextRequest();
     void rearCameraFollowsTheGear();
+    void restrictionSignLetsTheCarDriveAndStop();
     void panelsListWhatIsGoingOn();
     void panelsFoldInAndOut();
 
@@ -548,6 +549,20 @@ void tst_SceneInput::rearCameraFollowsTheGear()
 
     click("gear-D");
     QTRY_VERIFY_WITH_TIMEOUT(shows("Media/Sources"), patienceMs);
+}
+
+void tst_SceneInput::restrictionSignLetsTheCarDriveAndStop()
+{
+    type(Qt::Key_F2);
+    click("provoke-update");
+    QTRY_VERIFY_WITH_TIMEOUT(rests() && popup("system/update"), patienceMs);
+
+    click("restriction");
+    QTRY_VERIFY_WITH_TIMEOUT(rests() && !popup("system/update"), patienceMs);
+    QVERIFY(m_cockpit->vehicle.isMoving());
+
+    click("restriction");
+    QTRY_VERIFY_WITH_TIMEOUT(!m_cockpit->vehicle.isMoving(), patienceMs);
 }
 
 void tst_SceneInput::panelsListWhatIsGoingOn()
