@@ -26,7 +26,7 @@ using namespace HmiStateMachine;
 
 namespace {
 
-constexpr int patienceMs = 8000; // sanitizers are slow
+constexpr int patienceMs = 30000; // sanitizers are slow
 
 /** Where screens were while they moved in. */
 class Movements : public QObject
