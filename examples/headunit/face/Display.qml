@@ -91,7 +91,8 @@ Rectangle {
         objectName: "offer"
         anchors.horizontalCenter: screenHost.horizontalCenter
         anchors.bottom: domainBar.top
-        anchors.bottomMargin: 20
+        // The map tells there when the car arrives.
+        anchors.bottomMargin: root.view === "Navigation/Map" ? 148 : 20
         enabled: !root.alone
     }
 
