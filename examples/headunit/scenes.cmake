@@ -16,7 +16,7 @@ file(CHMOD ${runtime_dir} DIRECTORY_PERMISSIONS OWNER_READ OWNER_WRITE OWNER_EXE
 set(scene_environment
     QT_QUICK_BACKEND=software
     XDG_RUNTIME_DIR=${runtime_dir}
-    LSAN_OPTIONS=fast_unwind_on_malloc=0:suppressions=${scene_tests_dir}/leaks.supp)
+    LSAN_OPTIONS=fast_unwind_on_malloc=0:suppressions=${scene_tests_dir}/leaks.supp:print_suppressions=0)
 set(no_display DISPLAY=unset: WAYLAND_DISPLAY=unset: QT_QPA_PLATFORM=unset:)
 
 # Their displays are started one after the other: two at once may choose the same number.
