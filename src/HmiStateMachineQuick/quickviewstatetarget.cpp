@@ -139,7 +139,7 @@ QString QuickViewStateTarget::backTarget() const
 
 bool QuickViewStateTarget::isBackPossible() const
 {
-    return !m_backTarget.isEmpty();
+    return m_backPossible;
 }
 
 bool QuickViewStateTarget::popupsEnabled() const
@@ -453,8 +453,12 @@ void QuickViewStateTarget::updateBackTarget()
         return;
     }
     const QString target = m_viewState ? backTargetOf(m_viewState) : QString();
-    if (target != m_backTarget) {
+    // A direct target may be a state without a name.
+    const bool possible =
+        !target.isEmpty() || (m_viewState && m_viewState->directBackTransitionTarget());
+    if (target != m_backTarget || possible != m_backPossible) {
         m_backTarget = target;
+        m_backPossible = possible;
         Q_EMIT backTargetChanged();
     }
 }

@@ -104,7 +104,10 @@ public:
     /** What the flow told the active view by HmiViewState::setActivationData(). */
     QVariant activationData() const;
 
-    /** The state to which back leads from the active view; empty when it leads nowhere. */
+    /**
+     * The name of the state to which back leads from the active view; empty when it leads nowhere,
+     * or to a state without a name.
+     */
     QString backTarget() const;
     bool isBackPossible() const;
 
@@ -208,6 +211,7 @@ private:
     QVariantMap m_viewData;
     QVariant m_activationData;
     QString m_backTarget;
+    bool m_backPossible = false;
     QPointer<HmiViewState> m_viewState;
     bool m_popupsEnabled = true;
     bool m_transitioning = false;

@@ -62,6 +62,7 @@ private Q_SLOTS:
 
     void theBackTargetIsThatOfTheActiveView();
     void theBackTargetFollowsAChangeOfTheView();
+    void backIsPossibleToAStateWithoutAName();
     void aDirectBackTargetCounts();
     void theBackTargetOfADummyIsSeenAfterItsEntry();
     void aDummyBorrowsTheBackTargetOfTheViewBefore();
@@ -396,6 +397,20 @@ void tst_QuickViewStateTarget::theBackTargetFollowsAChangeOfTheView()
     QCOMPARE(flow.target->backTarget(), QString("Radio"));
     radio->setHandlesBackEvent(true);
     QCOMPARE(flow.target->backTarget(), QString("Radio"));
+}
+
+void tst_QuickViewStateTarget::backIsPossibleToAStateWithoutAName()
+{
+    QuickFlow flow(messages());
+    HmiViewState *radio = flow.view("Radio");
+    auto *nameless = new QState(flow.screens->exclusiveState());
+    flow.start(radio);
+    QCOMPARE(flow.target->isBackPossible(), false);
+
+    radio->createDirectBackTransition(nameless);
+
+    QCOMPARE(flow.target->backTarget(), QString());
+    QCOMPARE(flow.target->isBackPossible(), true);
 }
 
 void tst_QuickViewStateTarget::aDirectBackTargetCounts()
