@@ -64,6 +64,9 @@ build_packages=(cmake ninja-build g++ ccache qtbase5-dev)
 quick_packages=(qtdeclarative5-dev qtdeclarative5-dev-tools qml-module-qtqml-models2
     qml-module-qtquick2 qml-module-qtquick-shapes qml-module-qtquick-window2)
 
+# What the tool for interruption rules needs.
+rules_packages=(nlohmann-json3-dev libcli11-dev)
+
 # The fonts of the head unit's screens.
 scene_packages=(fonts-inter fonts-material-design-icons-iconfont)
 
