@@ -1,0 +1,47 @@
+#include "checks.h"
+
+#include "rules/libraryfacts.h"
+#include "rules/names.h"
+
+#include <algorithm>
+
+namespace hmirules {
+
+namespace {
+
+// What is odd about a name; empty when nothing is.
+QString oddity(const QString &name)
+{
+    const auto isControl = [](QChar c) { return c.category() == QChar::Other_Control; };
+    if (std::any_of(name.cbegin(), name.cend(), isControl)) {
+        return "has a control character";
+    }
+    if (name != name.trimmed()) {
+        return "begins or ends with a space";
+    }
+    if (name.startsWith('/') || name.endsWith('/') || name.contains("//")) {
+        return "has an empty part beside a slash";
+    }
+    return QString();
+}
+
+} // namespace
+
+void checkNames(Findings *findings)
+{
+    for (const int number : findings->files()) {
+        for (const NameUse &use : namesIn(findings->file(number))) {
+            const QString odd = oddity(use.name);
+            if (!odd.isEmpty()) {
+                findings->add("suspicious-name", use.place, '"' + use.name + "\" " + odd);
+            }
+            if (use.name.contains('*') && !isWildcard(use.name)) {
+                findings->add("never-matches", use.place,
+                              '"' + use.name
+                                  + "\" is no wildcard, and no popup has an asterisk in its name");
+            }
+        }
+    }
+}
+
+} // namespace hmirules
