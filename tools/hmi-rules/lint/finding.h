@@ -35,6 +35,8 @@ public:
     const RuleBase &base() const { return m_base; }
     const Inventory &inventory() const { return m_inventory; }
 
+    int firstFile() const { return m_firstFile; }
+
     /** The numbers of the files that are checked. */
     std::vector<int> files() const;
     const RuleFile &file(int number) const

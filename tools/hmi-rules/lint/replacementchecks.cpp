@@ -54,7 +54,8 @@ private:
     {
         const std::vector<Related> related = {{lost.place, "this one is lost"}};
         if (lost.place.file != winner.place.file) {
-            if (sayDifferent(lost, winner)) {
+            // What is loaded before is there to be replaced.
+            if (lost.place.file >= m_findings->firstFile() && sayDifferent(lost, winner)) {
                 m_findings->add("contradicting-files", winner.place,
                                 describe(winner) + " takes the place of " + value(lost)
                                     + " in an earlier file",

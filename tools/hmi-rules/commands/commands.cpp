@@ -1,0 +1,141 @@
+#include "commands.h"
+
+#include "loading.h"
+
+#include "diff/differencetext.h"
+#include "explain/explanationtext.h"
+#include "input/inventory.h"
+#include "lint/findinglist.h"
+#include "matrix/matrixtext.h"
+
+#include <QFile>
+
+#include <stdexcept>
+
+namespace hmirules {
+
+namespace {
+
+Outcome written(const QString &text, int exitCode = exitFine)
+{
+    return {exitCode, text.toUtf8(), QByteArray(), true};
+}
+
+Outcome refused(const Fault &fault)
+{
+    return {exitUnusable, QByteArray(), toText(fault).toUtf8(), false};
+}
+
+} // namespace
+
+Outcome runExplain(const Options &options)
+{
+    Fault fault;
+    Inventory inventory;
+    const auto base = loadRules(options.base + options.files, &fault);
+    if (!base || !readInventory(options, &inventory, &fault)) {
+        return refused(fault);
+    }
+    const Explanation explanation = explain(*base, inventory, options.front, options.requested);
+    const QString viewId = inventory.viewIdOf(options.requested);
+    std::vector<BlockingExplanation> blocking;
+    for (const QString &domain : options.domains) {
+        blocking.push_back(explainBlocking(*base, viewId, domain, Site::DomainBlacklist));
+    }
+    for (const QString &view : options.views) {
+        blocking.push_back(explainBlocking(*base, viewId, view, Site::ViewBlacklist));
+    }
+    if (options.format == Format::Json) {
+        return written(explanationAsJson(*base, explanation, blocking));
+    }
+    const Paint paint(isColored(options));
+    return written(explanationAsText(*base, explanation, blocking, paint));
+}
+
+Outcome runMatrix(const Options &options)
+{
+    Fault fault;
+    Inventory inventory;
+    const auto base = loadRules(options.base + options.files, &fault);
+    if (!base || !readInventory(options, &inventory, &fault)) {
+        return refused(fault);
+    }
+    const auto population = restrictedTo(options.only, populationOf(*base, inventory));
+    if (!isListable(population, &fault)) {
+        return refused(fault);
+    }
+    const Matrix matrix = makeMatrix(*base, population);
+    if (options.format == Format::Html) {
+        return written(matrixAsHtml(*base, matrix));
+    }
+    if (options.format == Format::Csv) {
+        return written(options.blocking ? blockingAsCsv(*base, matrix)
+                                        : matrixAsCsv(*base, matrix));
+    }
+    return written(matrixAsText(*base, matrix, Paint(isColored(options))));
+}
+
+Outcome runDiff(const Options &options)
+{
+    Fault fault;
+    Inventory inventory;
+    const auto before = loadRules(options.base + options.files.mid(0, 1), &fault);
+    const auto after = before ? loadRules(options.base + options.files.mid(1), &fault) : nullptr;
+    if (!after || !readInventory(options, &inventory, &fault)) {
+        return refused(fault);
+    }
+    const auto population = commonPopulation(*before, *after, inventory);
+    if (!isListable(population, &fault)) {
+        return refused(fault);
+    }
+    const Difference difference = compare(*before, *after, population);
+    const bool isEmpty = difference.decisions.empty() && difference.blockings.empty();
+    const QString text = options.format == Format::Json
+        ? differenceAsJson(*before, *after, difference)
+        : differenceAsText(*before, *after, difference, Paint(isColored(options)));
+    return written(text, isEmpty ? exitFine : exitFound);
+}
+
+Outcome runSchema(const Options &options)
+{
+    Q_UNUSED(options)
+    QFile file(":/hmi-rules/popup-interruptions.schema.json");
+    if (!file.open(QIODevice::ReadOnly)) {
+        throw std::logic_error("missing in the program: the schema");
+    }
+    return written(QString::fromUtf8(file.readAll()));
+}
+
+Outcome runFindings(const Options &options)
+{
+    const FindingKind *kind = findingKind(options.finding);
+    if (!options.finding.isEmpty() && !kind) {
+        Fault fault;
+        fault.message = "there is no finding \"" + options.finding + '"';
+        fault.remedy = "\"hmi-rules findings\" lists all.";
+        return refused(fault);
+    }
+    return written(options.format == Format::Markdown ? findingsAsMarkdown(kind)
+                                                      : findingsAsText(kind));
+}
+
+Outcome run(const Options &options)
+{
+    switch (options.command) {
+    case Command::Lint:
+        return runLint(options);
+    case Command::Explain:
+        return runExplain(options);
+    case Command::Matrix:
+        return runMatrix(options);
+    case Command::Diff:
+        return runDiff(options);
+    case Command::Schema:
+        return runSchema(options);
+    case Command::Findings:
+        break;
+    }
+    return runFindings(options);
+}
+
+} // namespace hmirules
