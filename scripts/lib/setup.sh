@@ -67,6 +67,9 @@ quick_packages=(qtdeclarative5-dev qtdeclarative5-dev-tools qml-module-qtqml-mod
 # What the tool for interruption rules needs.
 rules_packages=(nlohmann-json3-dev libcli11-dev)
 
+# What its tests need beside that.
+rules_test_packages=(python3-jsonschema)
+
 # The fonts of the head unit's screens.
 scene_packages=(fonts-inter fonts-material-design-icons-iconfont)
 
