@@ -7,10 +7,7 @@
 #include "input/inventory.h"
 #include "lint/findinglist.h"
 #include "matrix/matrixtext.h"
-
-#include <QFile>
-
-#include <stdexcept>
+#include "report/resource.h"
 
 namespace hmirules {
 
@@ -99,11 +96,7 @@ Outcome runDiff(const Options &options)
 Outcome runSchema(const Options &options)
 {
     Q_UNUSED(options)
-    QFile file(":/hmi-rules/popup-interruptions.schema.json");
-    if (!file.open(QIODevice::ReadOnly)) {
-        throw std::logic_error("missing in the program: the schema");
-    }
-    return written(QString::fromUtf8(file.readAll()));
+    return written(resource("popup-interruptions.schema.json"));
 }
 
 Outcome runFindings(const Options &options)

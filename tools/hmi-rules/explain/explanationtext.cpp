@@ -79,8 +79,9 @@ public:
                       m_paint.bold(blocking.blocking.isBlocked ? "blocked" : "not blocked"),
                       byDomain ? "in the domain" : "by the view", blocking.where));
         line(byDomain
-                 ? "    a request is refused there, and a shown popup is hidden while it is active."
-                 : "    a shown popup is hidden when the view becomes active; requests are not "
+                 ? "    A request is refused there, and a shown popup is hidden while the domain "
+                   "is active."
+                 : "    A shown popup is hidden when the view becomes active; requests are not "
                    "affected.");
         line("Decided by: "
              + (blocking.blocking.site < 0 ? QString("no list")

@@ -1,26 +1,13 @@
 #include "matrixtext.h"
 
 #include "report/json.h"
+#include "report/resource.h"
 #include "report/sitetext.h"
 #include "rules/libraryfacts.h"
-
-#include <QFile>
-
-#include <stdexcept>
 
 namespace hmirules {
 
 namespace {
-
-// Made into the program from the folder page.
-QString resource(const char *name)
-{
-    QFile file(QLatin1String(":/hmi-rules/") + name);
-    if (!file.open(QIODevice::ReadOnly)) {
-        throw std::logic_error(std::string("missing in the program: ") + name);
-    }
-    return QString::fromUtf8(file.readAll());
-}
 
 void addPlace(const RuleBase &base, int site, OrderedJson *json)
 {
