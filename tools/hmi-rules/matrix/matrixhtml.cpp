@@ -97,6 +97,15 @@ OrderedJson blockedAsJson(const RuleBase &base, const Matrix &matrix)
     return list;
 }
 
+QString joined(const QStringList &names)
+{
+    QStringList texts;
+    for (const QString &name : names) {
+        texts.append(resource(name));
+    }
+    return texts.join('\n');
+}
+
 // Within a script element only "<" could end the text early.
 QString forScript(const OrderedJson &json)
 {
@@ -118,10 +127,11 @@ QString matrixAsHtml(const RuleBase &base, const Matrix &matrix)
                               {"reasons", reasonsAsJson(base, matrix)},
                               {"rows", rows},
                               {"blocked", blockedAsJson(base, matrix)}};
-    // The data come last: they may contain anything, also a placeholder.
+    // The data come last: they may contain anything, also a placeholder. The scripts stand in the
+    // order in which they build on each other.
     return resource("matrix.html")
-        .replace("@MATRIX_STYLE@", resource("matrix.css"))
-        .replace("@MATRIX_SCRIPT@", resource("matrix.js"))
+        .replace("@MATRIX_STYLE@", joined({"matrix.css", "grid.css"}))
+        .replace("@MATRIX_SCRIPT@", joined({"model.js", "grid.js", "matrix.js"}))
         .replace("@MATRIX_DATA@", forScript(data));
 }
 
