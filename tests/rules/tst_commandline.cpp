@@ -128,11 +128,14 @@ void unusualRows()
         << Arguments{"lint", "[a,b]", "[c]"} << "command=lint files=[a,b],[c]";
     QTest::newRow("a wildcard in brackets")
         << Arguments{"matrix", "f", "--only", "[a,b]"} << "command=matrix files=f only=[a,b]";
+    QTest::newRow("a file of two plus signs")
+        << Arguments{"lint", "++", "a"} << "command=lint files=++,a";
+    QTest::newRow("a command behind --") << Arguments{"--", "lint", "a"} << "command=lint files=a";
     QTest::newRow("a file with a blank") << Arguments{"lint", "a b"} << "command=lint files=a b";
     QTest::newRow("a value with an equals sign")
         << Arguments{"lint", "f", "--base=a=b"} << "command=lint files=f base=a=b";
-    QTest::newRow("files with a hyphen") << Arguments{"lint", "f", "--", "-b", "--each", "--"}
-                                         << "command=lint files=f,-b,--each,--";
+    QTest::newRow("files with a hyphen") << Arguments{"lint", "f", "--", "-b", "--each=", "--"}
+                                         << "command=lint files=f,-b,--each=,--";
     QTest::newRow("popups with a hyphen") << Arguments{"explain", "f", "--", "-p", "--t"}
                                           << "command=explain files=f front=-p requested=--t";
     QTest::newRow("nothing behind --")

@@ -42,26 +42,22 @@ Options stored(const SplitArguments &arguments)
 
 Parsed parse(const std::vector<std::string> &arguments)
 {
-    const SplitArguments split = hmirules::split(arguments);
-    QByteArray error = commandError(split);
-    if (isGiven(split, helpName) && (split.command || split.outside.isEmpty())) {
-        return {std::nullopt, split.command ? commandHelp(*split.command) : programHelp(), 0};
+    const SplitArguments told = split(arguments);
+    // In spite of faults, though not for a command that does not exist.
+    const bool helps = told.command || !told.word;
+    if (helps && isGiven(told, helpName)) {
+        return {std::nullopt, told.command ? commandHelp(*told.command) : programHelp(), 0};
     }
-    if (isGiven(split, versionName) && (split.command || split.outside.isEmpty())) {
+    if (helps && isGiven(told, versionName)) {
         return {std::nullopt, program().name + ' ' + program().version + '\n', 0};
     }
-    if (error.isEmpty()) {
-        error = openEndError(arguments);
+    const QByteArray wrong = usageError(told, arguments);
+    if (!wrong.isEmpty()) {
+        return refused(wrong, told.command);
     }
-    if (error.isEmpty()) {
-        error = parameterError(split);
-    }
-    if (!error.isEmpty()) {
-        return refused(error, split.command);
-    }
-    const Options options = stored(split);
-    error = contradiction(options);
-    return error.isEmpty() ? Parsed{options, QByteArray(), 0} : refused(error, split.command);
+    const Options options = stored(told);
+    const QByteArray contrary = contradiction(options);
+    return contrary.isEmpty() ? Parsed{options, QByteArray(), 0} : refused(contrary, told.command);
 }
 
 } // namespace hmirules

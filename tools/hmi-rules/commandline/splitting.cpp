@@ -1,11 +1,13 @@
 #include "commandline/splitting.h"
 
+#include <algorithm>
 #include <CLI/CLI.hpp>
 
 namespace hmirules {
 
 namespace {
 
+using Arguments = std::vector<std::string>;
 using Bound = std::vector<std::pair<const Parameter *, CLI::Option *>>;
 
 std::string names(const Parameter &option)
@@ -27,9 +29,8 @@ void addOptions(CLI::App &app, const QVector<Parameter> &options, Bound &bound)
     }
 }
 
-// An argument that waits for more than can come takes files whatever they are called: "[a]" would
-// be taken apart as a list where extra values are allowed, and "-b" behind "--" would be an option
-// once the argument had enough.
+// A repeatable argument waits for more than can come. Were extra values allowed in place of that, a
+// file named "[a]" would be taken apart as a list.
 void addArguments(CLI::App &app, const QVector<Parameter> &arguments, Bound &bound)
 {
     constexpr int endless = CLI::detail::expected_max_vector_size - 1;
@@ -41,66 +42,64 @@ void addArguments(CLI::App &app, const QVector<Parameter> &arguments, Bound &bou
     }
 }
 
-QVector<Given> valuesOf(const Bound &bound)
+void addGiven(const Bound &bound, SplitArguments &result)
 {
-    QVector<Given> given;
     for (const auto &[parameter, option] : bound) {
         QByteArrayList values;
         for (const std::string &value : option->results()) {
             values.append(QByteArray::fromStdString(value));
         }
         if (!values.isEmpty()) {
-            given.append({parameter, values});
+            result.given.append({parameter, values});
         }
     }
-    return given;
 }
 
-QByteArrayList remaining(const CLI::App &app)
+// Gives back what no parameter takes.
+QByteArrayList splitPart(const Arguments &part, const QVector<Parameter> &options,
+                         const QVector<Parameter> &arguments, SplitArguments &result)
 {
+    CLI::App app;
+    Bound bound;
+    app.set_help_flag();
+    app.allow_extras();
+    addOptions(app, options, bound);
+    addArguments(app, arguments, bound);
+    try {
+        app.parse(Arguments(part.rbegin(), part.rend()));
+    } catch (const CLI::ParseError &) {
+        // As nothing else is refused, the last argument is an option whose value is missing.
+        result.withoutValue = QByteArray::fromStdString(part.back());
+    }
+    addGiven(bound, result);
+
     QByteArrayList rest;
     for (const std::string &argument : app.remaining()) {
         rest.append(QByteArray::fromStdString(argument));
     }
+    rest.removeOne("--"); // the one that ends the options; a further one is an argument
     return rest;
 }
 
 } // namespace
 
+// Each side of the command is parsed by itself: parsed as a command within a program, an argument
+// "++" would end it, and a later word could be another command.
 SplitArguments split(const std::vector<std::string> &arguments)
 {
-    CLI::App app;
-    app.set_help_flag();
-    app.allow_extras();
-    app.require_subcommand(0, 1);
-    std::vector<Bound> bound(1);
-    addOptions(app, program().options, bound[0]);
-    for (const CommandDefinition &definition : program().commands) {
-        CLI::App *command = app.add_subcommand(definition.name.toStdString());
-        bound.emplace_back();
-        addOptions(*command, definition.options, bound.back());
-        addArguments(*command, definition.arguments, bound.back());
-    }
-
+    const auto word =
+        std::find_if(arguments.cbegin(), arguments.cend(),
+                     [](const std::string &each) { return each.compare(0, 1, "-") != 0; });
     SplitArguments result;
-    try {
-        app.parse(std::vector<std::string>(arguments.rbegin(), arguments.rend()));
-    } catch (const CLI::ParseError &) {
-        // As nothing else is refused, the last argument is an option whose value is missing.
-        result.withoutValue = QByteArray::fromStdString(arguments.back());
+    result.outside = splitPart(Arguments(arguments.cbegin(), word), program().options, {}, result);
+    if (word == arguments.cend()) {
+        return result;
     }
-
-    result.outside = remaining(app);
-    result.given = valuesOf(bound[0]);
-    for (const CLI::App *command : app.get_subcommands()) {
-        const QByteArray name = QByteArray::fromStdString(command->get_name());
-        result.command = findCommand(name);
-        result.given +=
-            valuesOf(bound[size_t(result.command - program().commands.constData()) + 1]);
-        result.unknown = remaining(*command);
-        // Left over, too, where all that follows it went to the command.
-        result.unknown.removeOne("--");
-        result.outside.removeOne("--");
+    result.word = QByteArray::fromStdString(*word);
+    result.command = findCommand(*result.word);
+    if (result.command) {
+        result.unknown = splitPart(Arguments(word + 1, arguments.cend()), result.command->options,
+                                   result.command->arguments, result);
     }
     return result;
 }

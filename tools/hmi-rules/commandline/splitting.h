@@ -2,6 +2,7 @@
 
 #include "commandline/definitions.h"
 
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -17,10 +18,11 @@ struct Given
 /** What stands on the command line, told apart and not judged. */
 struct SplitArguments
 {
-    const CommandDefinition *command = nullptr; ///< null when none is given
-    QVector<Given> given; ///< the program's options, then the command's, in the order defined
-    QByteArrayList outside; ///< what stands before a command and is none of the program's options
-    QByteArrayList unknown; ///< what no parameter of the command takes
+    std::optional<QByteArray> word; ///< where the command stands
+    const CommandDefinition *command = nullptr; ///< null when the word names none
+    QByteArrayList outside; ///< what stands before the command and is none of the program's options
+    QByteArrayList unknown; ///< what stands behind it and is none of its parameters
+    QVector<Given> given; ///< in the order of the definitions
     QByteArray withoutValue; ///< the option at the end that lacks its value
 };
 

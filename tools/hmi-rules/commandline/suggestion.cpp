@@ -38,7 +38,7 @@ QByteArray nearest(const QByteArray &word, const QByteArrayList &words)
     int least = std::max(2, int(word.size()) / 3) + 1;
     for (const QByteArray &candidate : words) {
         const int steps = distance(word, candidate);
-        if (steps < least && steps < candidate.size()) {
+        if (steps < least) {
             least = steps;
             best = candidate;
         }

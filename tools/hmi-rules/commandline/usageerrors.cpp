@@ -62,12 +62,13 @@ QByteArray outsideError(const SplitArguments &arguments)
         return QByteArray();
     }
     const QByteArray outside = arguments.outside.first();
-    if (findOption(arguments.command->options, outside)) {
-        return "option " + quoted(outside) + " belongs behind the command "
-            + arguments.command->name;
-    }
-    return isOption(outside) ? unknownOption(outside, arguments.command->options)
-                             : "unexpected argument " + quoted(outside);
+    const QVector<CommandDefinition> &commands = program().commands;
+    const bool ofACommand =
+        std::any_of(commands.cbegin(), commands.cend(), [&outside](const CommandDefinition &each) {
+            return findOption(each.options, outside);
+        });
+    return ofACommand ? "option " + quoted(outside) + " belongs behind a command"
+                      : unknownOption(outside, program().options);
 }
 
 QByteArray missingArgument(const SplitArguments &arguments)
@@ -130,32 +131,26 @@ QByteArray givenError(const Given &given)
     return QByteArray();
 }
 
-} // namespace
-
 QByteArray commandError(const SplitArguments &arguments)
 {
     if (arguments.command) {
         return QByteArray();
     }
-    const QByteArray outside = arguments.outside.value(0);
     QByteArrayList names;
     for (const CommandDefinition &command : program().commands) {
         names.append(command.name);
     }
     const QByteArray all = "; the commands are " + enumerated(names, "and");
-    if (arguments.outside.isEmpty()) {
+    if (!arguments.word) {
         return "a command is missing" + all;
     }
-    if (isOption(outside)) {
-        return unknownOption(outside, program().options);
-    }
-    const QByteArray meant = proposal(outside, names);
-    return "unknown command " + quoted(outside) + (meant.isEmpty() ? all : meant);
+    const QByteArray meant = proposal(*arguments.word, names);
+    return "unknown command " + quoted(*arguments.word) + (meant.isEmpty() ? all : meant);
 }
 
 QByteArray parameterError(const SplitArguments &arguments)
 {
-    for (const auto check : {outsideError, unknownError, missingValue, missingArgument}) {
+    for (const auto check : {unknownError, missingValue, missingArgument}) {
         const QByteArray error = check(arguments);
         if (!error.isEmpty()) {
             return error;
@@ -170,6 +165,7 @@ QByteArray parameterError(const SplitArguments &arguments)
     return QByteArray();
 }
 
+// An option that ends in "=" is no way to give an empty value.
 QByteArray openEndError(const std::vector<std::string> &arguments)
 {
     for (const std::string &each : arguments) {
@@ -182,6 +178,20 @@ QByteArray openEndError(const std::vector<std::string> &arguments)
         }
     }
     return QByteArray();
+}
+
+} // namespace
+
+QByteArray usageError(const SplitArguments &split, const std::vector<std::string> &arguments)
+{
+    for (const auto check : {outsideError, commandError}) {
+        const QByteArray error = check(split);
+        if (!error.isEmpty()) {
+            return error;
+        }
+    }
+    const QByteArray error = openEndError(arguments);
+    return error.isEmpty() ? parameterError(split) : error;
 }
 
 } // namespace hmirules
