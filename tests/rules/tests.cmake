@@ -17,3 +17,25 @@ target_sources(tst_commandline PRIVATE rules/optiontext.cpp rules/optiontext.h)
 target_compile_definitions(tst_commandlinehelp PRIVATE
     HMI_TEST_DATA_DIR="${CMAKE_CURRENT_SOURCE_DIR}/rules/help"
     HMI_PROJECT_VERSION="${PROJECT_VERSION}")
+
+if(TARGET hmi_rules_docs)
+    find_program(HMI_TEST_BASH NAMES bash REQUIRED)
+    find_program(HMI_TEST_GROFF NAMES groff REQUIRED)
+    get_target_property(man_page hmi_rules_docs HMI_MAN_PAGE)
+    get_target_property(completion hmi_rules_docs HMI_COMPLETION)
+    foreach(name IN ITEMS bashcompletion manpage)
+        hmi_add_test(rules ${name})
+        add_dependencies(tst_${name} hmi_rules_docs)
+        target_link_libraries(tst_${name} PRIVATE hmi_rules_docgen_parts)
+    endforeach()
+    target_compile_definitions(tst_bashcompletion PRIVATE
+        HMI_TEST_BASH="${HMI_TEST_BASH}"
+        HMI_COMPLETION="${completion}"
+        HMI_COMPLETION_TEMPLATE="${PROJECT_SOURCE_DIR}/tools/hmi-rules/docgen/completion.bash.in")
+    target_compile_definitions(tst_manpage PRIVATE
+        HMI_TEST_GROFF="${HMI_TEST_GROFF}"
+        HMI_MAN_PAGE="${man_page}"
+        HMI_PROJECT_VERSION="${PROJECT_VERSION}")
+else()
+    message(STATUS "Tests of the man page and completion of hmi-rules: off (they are not built)")
+endif()

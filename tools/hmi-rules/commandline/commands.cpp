@@ -176,7 +176,7 @@ CommandDefinition findingsCommand()
              outputOption()})
             + helpOptions(),
         {{0, "Explained."}, {2, "The command line is wrong, or no finding has the ID."}},
-        {{"hmi-rules findings", "Lists all findings."},
+        {{"hmi-rules findings shadowed-wildcard", "Explains one finding."},
          {"hmi-rules findings --format markdown -o findings.md",
           "Writes all of them as a page of documentation."}},
     };
