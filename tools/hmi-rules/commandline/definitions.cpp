@@ -1,6 +1,7 @@
 #include "commandline/definitions.h"
 #include "commandline/commands.h"
 #include "commandline/parameters.h"
+#include "version.h"
 
 #include <algorithm>
 
@@ -12,7 +13,7 @@ ProgramDefinition makeProgram()
 {
     return {
         "hmi-rules",
-        HMI_RULES_VERSION,
+        toolVersion,
         "check, explain and compare popup interruption files",
         "hmi-rules reads the popup interruption files of an application that uses HmiStateMachine. "
         "It finds their faults, tells which behaviour a requested popup meets and why, shows all "
@@ -28,8 +29,12 @@ ProgramDefinition makeProgram()
         {{"Popup interruption file",
           "JSON in UTF-8: an array with one entry a popup or wildcard. The command schema prints "
           "its JSON Schema, for editors."},
-         {"Inventory", "What the application has: its popups, domains and views."},
-         {"List of popups, domains or views", "Text in UTF-8 with one name a line."}},
+         {"Inventory",
+          "JSON in UTF-8: an object with lists of the popups, domains and views that the "
+          "application "
+          "has, each of which may be missing."},
+         {"List of popups, domains or views", "Text in UTF-8 with one name a line."},
+         {"share/HmiStateMachine/schema", "JSON Schemas of both kinds of JSON, for editors."}},
         "The documentation of HmiStateMachine, which loads these files.",
     };
 }
