@@ -97,7 +97,7 @@ CommandDefinition matrixCommand()
         "matrix",
         "show all decisions, popup by popup",
         "Shows for each popup in front and each requested popup the behaviour and its reason.\n\n"
-        "The popups are those that the file names, and those of the inventory.",
+        "The popups are those of the inventory, or without one those that the file names.",
         {fileArgument("FILE", "The popup interruption file.")},
         QVector<Parameter>(
             {repeated(nameOption("--only", "POPUP",

@@ -1,6 +1,6 @@
 #include "commandline/usageerrors.h"
 #include "commandline/quoting.h"
-#include "commandline/suggestion.h"
+#include "lint/guess.h"
 
 #include <algorithm>
 
@@ -15,8 +15,11 @@ bool isOption(const QByteArray &argument)
 
 QByteArray proposal(const QByteArray &word, const QByteArrayList &words)
 {
-    const QByteArray meant = nearest(word, words);
-    return meant.isEmpty() ? QByteArray() : "; did you mean " + quoted(meant) + "?";
+    QStringList candidates;
+    for (const QByteArray &candidate : words) {
+        candidates.append(QString::fromUtf8(candidate));
+    }
+    return didYouMean(QString::fromUtf8(word), candidates).toUtf8();
 }
 
 // "option --output" or "argument FILE".

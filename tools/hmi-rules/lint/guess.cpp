@@ -35,10 +35,11 @@ QString didYouMean(const QString &name, const QStringList &candidates)
         return QString();
     }
     QString best;
-    int least = name.size() / share + 1;
+    int least = std::max(2, name.size() / share); // two letters exchanged are two wrong ones
     for (const QString &candidate : candidates) {
         const int wrong = distance(name.toCaseFolded(), candidate.toCaseFolded());
-        if (wrong <= least && candidate != name && (best.isEmpty() || wrong < least)) {
+        if (wrong <= least && wrong < candidate.size() && candidate != name
+            && (best.isEmpty() || wrong < least)) {
             least = wrong;
             best = candidate;
         }
