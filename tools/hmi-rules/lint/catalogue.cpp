@@ -97,6 +97,12 @@ const std::vector<FindingKind> &findingKinds()
         {"shadowed-blacklist", Severity::Note, "A blacklist hides a wildcard's blacklist",
          "One list alone counts: where only the hidden one would block the popup, it is shown.",
          "Repeat the names of the hidden list, unless the popup is meant to be shown there."},
+        {"overlapping-wildcards", Severity::Note,
+         "A popup is under two wildcards that say different things",
+         "That popup of any module (*/popup) goes before any popup of that module (module/*), "
+         "whatever "
+         "their order in the file.",
+         "Name the popup itself, so that nobody has to know which wildcard goes first."},
         {"empty-interruptions", Severity::Note, "A list of rules is empty",
          "It has no effect: it does not hide the rules of a wildcard.", "Remove it."},
         {"empty-entry", Severity::Note, "An entry says nothing", "It has no effect.",

@@ -16,6 +16,9 @@ void checkReplacements(Findings *findings);
 /** Entries and lists that hide those of wildcards. */
 void checkShadows(Findings *findings);
 
+/** Popups under two wildcards of which one goes before the other. */
+void checkOverlaps(Findings *findings);
+
 /** Names that can match nothing, whatever popups there are. */
 void checkNames(Findings *findings);
 

@@ -11,7 +11,7 @@ std::vector<Finding> lint(const RuleBase &base, const Inventory &inventory, int 
 {
     Findings findings(base, inventory, firstFile);
     for (const auto check : {checkWarnings, checkShape, checkReplacements, checkNames, checkShadows,
-                             checkDecisions, checkInventory}) {
+                             checkOverlaps, checkDecisions, checkInventory}) {
         check(&findings);
     }
     std::vector<Finding> result = findings.takeSorted();
