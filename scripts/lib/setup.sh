@@ -67,8 +67,8 @@ quick_packages=(qtdeclarative5-dev qtdeclarative5-dev-tools qml-module-qtqml-mod
 # What the tool for interruption rules needs.
 rules_packages=(nlohmann-json3-dev libcli11-dev)
 
-# What its tests need beside that; groff and man check the man page.
-rules_test_packages=(python3-jsonschema groff-base man-db)
+# What its tests need beside that; groff and man check the man page, a browser the page of a matrix.
+rules_test_packages=(python3-jsonschema groff-base man-db chromium chromium-driver python3-selenium)
 
 # The fonts of the head unit's screens.
 scene_packages=(fonts-inter fonts-material-design-icons-iconfont)

@@ -39,3 +39,21 @@ if(TARGET hmi_rules_docs)
 else()
     message(STATUS "Tests of the man page and completion of hmi-rules: off (they are not built)")
 endif()
+
+# The page of a matrix in a browser. Debian's Python has Debian's modules; another may come first in
+# the search path.
+find_program(HMI_TEST_PYTHON NAMES python3 PATHS /usr/bin NO_DEFAULT_PATH)
+find_program(HMI_TEST_PYTHON NAMES python3 REQUIRED)
+find_program(HMI_TEST_CHROMIUM NAMES chromium REQUIRED)
+find_program(HMI_TEST_CHROMEDRIVER NAMES chromedriver REQUIRED)
+execute_process(COMMAND ${HMI_TEST_PYTHON} -c "import selenium"
+    RESULT_VARIABLE without_selenium OUTPUT_QUIET ERROR_QUIET)
+if(without_selenium)
+    message(FATAL_ERROR "${HMI_TEST_PYTHON} has no module selenium, which the test of the page needs")
+endif()
+add_test(NAME rules-page COMMAND ${HMI_TEST_PYTHON} -B
+    ${CMAKE_CURRENT_LIST_DIR}/page/page_test.py
+    --chromium ${HMI_TEST_CHROMIUM}
+    --chromedriver ${HMI_TEST_CHROMEDRIVER}
+    --parts ${PROJECT_SOURCE_DIR}/tools/hmi-rules/matrix/page)
+set_tests_properties(rules-page PROPERTIES LABELS rules TIMEOUT 120)
