@@ -49,7 +49,7 @@ find_program(HMI_TEST_CHROMEDRIVER NAMES chromedriver REQUIRED)
 execute_process(COMMAND ${HMI_TEST_PYTHON} -c "import selenium"
     RESULT_VARIABLE without_selenium OUTPUT_QUIET ERROR_QUIET)
 if(without_selenium)
-    message(FATAL_ERROR "${HMI_TEST_PYTHON} has no module selenium, which the test of the page needs")
+    message(FATAL_ERROR "${HMI_TEST_PYTHON} has no module selenium for the test of the page")
 endif()
 add_test(NAME rules-page COMMAND ${HMI_TEST_PYTHON} -B
     ${CMAKE_CURRENT_LIST_DIR}/page/page_test.py

@@ -39,7 +39,8 @@ async function search(selector, name, side, extent, view) {
     return null;
 }
 (async () => {
-    const column = await search('.requested', requested, 'scrollLeft', 'scrollWidth', 'clientWidth');
+    const column = await search(
+        '.requested', requested, 'scrollLeft', 'scrollWidth', 'clientWidth');
     const row = column
         && await search('.front', front, 'scrollTop', 'scrollHeight', 'clientHeight');
     const index = column?.getAttribute('aria-colindex');

@@ -3,6 +3,7 @@
 
 const CELL_WIDTH = 24;
 const CELL_HEIGHT = 22;
+const CHARACTER_WIDTH = 8.5; // of a wide font: a little room to spare is better than names cut off
 const MOST_PRINTED_CELLS = 10000; // more could not be read on paper
 const PRINTED_WIDTH = 1040; // of a landscape A4 sheet in CSS pixels, without its margins
 
@@ -38,8 +39,8 @@ class Grid {
 
     setSizes() {
         const longest = Math.max(0, ...this.matrix.popups.map(popup => popup.name.length));
-        this.nameWidth = Math.min(230, Math.max(120, longest * 7.5 + 16));
-        this.headHeight = Math.min(170, Math.max(80, longest * 7.5 + 12));
+        this.nameWidth = Math.min(230, Math.max(120, longest * CHARACTER_WIDTH + 16));
+        this.headHeight = Math.min(170, Math.max(80, longest * CHARACTER_WIDTH + 12));
         const style = this.scroller.style;
         document.documentElement.style.setProperty('--cell-width', `${CELL_WIDTH}px`);
         document.documentElement.style.setProperty('--cell-height', `${CELL_HEIGHT}px`);

@@ -1,5 +1,5 @@
-// What the reader does with the page: filters, highlighting, the active and the pinned cell, and the
-// link that restores them.
+// What the reader does with the page: filters, highlighting, the active and the pinned cell, and
+// the link that restores them.
 
 const matrix = new Matrix(JSON.parse(element('matrix-data').textContent));
 const grid = new Grid(matrix);
@@ -82,7 +82,8 @@ function tellWhetherHidden() {
 
 function hint() {
     return [make('h2', '', 'Details'), make('p', 'quiet',
-        'Click a cell, or move to it with the arrow keys and press Enter, to keep its details here.')];
+        'Click a cell, or move to it with the arrow keys and press Enter, to keep its details '
+        + 'here.')];
 }
 
 function details(cell) {
@@ -284,7 +285,9 @@ function onEscape(event) {
 }
 
 function listen() {
-    ['front', 'requested', 'only'].forEach(id => element(id).addEventListener('input', readControls));
+    for (const id of ['front', 'requested', 'only']) {
+        element(id).addEventListener('input', readControls);
+    }
     grid.scroller.addEventListener('mouseover', event => showTip(grid.cellOf(event.target)));
     grid.scroller.addEventListener('mouseleave', () => showTip(null));
     grid.scroller.addEventListener('wheel', () => showTip(null), { passive: true });

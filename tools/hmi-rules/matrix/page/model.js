@@ -7,7 +7,7 @@ const BEHAVIORS = [
     { name: 'Allow', letter: 'A', meaning: 'the popup in front goes and returns afterwards' },
     { name: 'AllowStack', letter: 'S', meaning: 'the popup in front waits beneath, still stacked' },
     { name: 'AllowNoReturn', letter: 'N', meaning: 'the popup in front goes for good' },
-    { name: 'invalid', letter: '!', meaning: 'a default that is none of the four; acts like Allow' },
+    { name: 'invalid', letter: '!', meaning: 'a default that is none of the four; like Allow' },
 ];
 const DECIDED_BY = { rule: 'by a rule', default: 'by a default', none: 'built in' };
 
