@@ -1,7 +1,16 @@
-# The schemas are judged by Debian's Python: another one in front of it may lack its modules.
-find_program(HMI_RULES_PYTHON python3 PATHS /usr/bin NO_DEFAULT_PATH REQUIRED)
+# Debian's Python has Debian's modules; another one may come before it in the search path.
+find_program(HMI_TEST_PYTHON NAMES python3 PATHS /usr/bin NO_DEFAULT_PATH)
+find_program(HMI_TEST_PYTHON NAMES python3 REQUIRED)
+foreach(module IN ITEMS jsonschema selenium)
+    execute_process(COMMAND ${HMI_TEST_PYTHON} -c "import ${module}"
+        RESULT_VARIABLE missing OUTPUT_QUIET ERROR_QUIET)
+    if(missing)
+        message(FATAL_ERROR "${HMI_TEST_PYTHON} has no module ${module}, which the tests of hmi-rules "
+            "need (in Debian python3-${module})")
+    endif()
+endforeach()
 add_test(NAME rulesschema
-    COMMAND ${HMI_RULES_PYTHON} ${CMAKE_CURRENT_SOURCE_DIR}/rules/schema/tst_schema.py)
+    COMMAND ${HMI_TEST_PYTHON} ${CMAKE_CURRENT_SOURCE_DIR}/rules/schema/tst_schema.py)
 set_tests_properties(rulesschema PROPERTIES LABELS rules TIMEOUT 30)
 
 hmi_add_test(rules popuprulespage)
@@ -40,20 +49,20 @@ else()
     message(STATUS "Tests of the man page and completion of hmi-rules: off (they are not built)")
 endif()
 
-# The page of a matrix in a browser. Debian's Python has Debian's modules; another may come first in
-# the search path.
-find_program(HMI_TEST_PYTHON NAMES python3 PATHS /usr/bin NO_DEFAULT_PATH)
-find_program(HMI_TEST_PYTHON NAMES python3 REQUIRED)
+# The page of a matrix in a browser: pages for the test, and one that the tool makes.
 find_program(HMI_TEST_CHROMIUM NAMES chromium REQUIRED)
 find_program(HMI_TEST_CHROMEDRIVER NAMES chromedriver REQUIRED)
-execute_process(COMMAND ${HMI_TEST_PYTHON} -c "import selenium"
-    RESULT_VARIABLE without_selenium OUTPUT_QUIET ERROR_QUIET)
-if(without_selenium)
-    message(FATAL_ERROR "${HMI_TEST_PYTHON} has no module selenium for the test of the page")
-endif()
-add_test(NAME rules-page COMMAND ${HMI_TEST_PYTHON} -B
-    ${CMAKE_CURRENT_LIST_DIR}/page/page_test.py
-    --chromium ${HMI_TEST_CHROMIUM}
-    --chromedriver ${HMI_TEST_CHROMEDRIVER}
-    --parts ${PROJECT_SOURCE_DIR}/tools/hmi-rules/matrix/page)
-set_tests_properties(rules-page PROPERTIES LABELS rules TIMEOUT 120)
+set(page_test ${HMI_TEST_PYTHON} -B ${CMAKE_CURRENT_LIST_DIR}/page/page_test.py
+    --chromium ${HMI_TEST_CHROMIUM} --chromedriver ${HMI_TEST_CHROMEDRIVER})
+add_test(NAME rules-page
+    COMMAND ${page_test} --parts ${PROJECT_SOURCE_DIR}/tools/hmi-rules/matrix/page)
+set(page ${CMAKE_CURRENT_BINARY_DIR}/rules-page.html)
+add_test(NAME rules-page-make
+    COMMAND hmi-rules matrix --format html -o ${page} interruptions.json
+    WORKING_DIRECTORY ${CMAKE_CURRENT_LIST_DIR}/page)
+add_test(NAME rules-page-made
+    COMMAND ${page_test} --page ${page} --expect ${CMAKE_CURRENT_LIST_DIR}/page/expected.json)
+set_tests_properties(rules-page-make PROPERTIES FIXTURES_SETUP rules_page)
+set_tests_properties(rules-page-made PROPERTIES FIXTURES_REQUIRED rules_page)
+set_tests_properties(rules-page rules-page-make rules-page-made PROPERTIES
+    LABELS rules TIMEOUT 120)
