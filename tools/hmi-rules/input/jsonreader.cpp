@@ -1,9 +1,12 @@
 #include "jsonreader.h"
 
+#include "jsonhint.h"
+
 #include <nlohmann/json.hpp>
 
 #include <QTextCodec>
 
+#include <algorithm>
 #include <cstring>
 #include <iterator>
 
@@ -75,14 +78,14 @@ public:
     bool parse_error(std::size_t position, const std::string &,
                      const nlohmann::json::exception &exception) override
     {
-        m_faultOffset = position == 0 ? 0 : static_cast<int>(position) - 1;
-        m_fault = QString::fromUtf8(exception.what());
+        m_stop.offset = position == 0 ? 0 : static_cast<int>(position) - 1;
+        m_stop.reason = QString::fromUtf8(exception.what());
+        m_stop.token = std::min(takeToken(), m_stop.offset);
         return false;
     }
 
     JsonNode takeRoot() { return std::move(m_root); }
-    QString fault() const { return m_fault; }
-    int faultOffset() const { return m_faultOffset; }
+    const JsonStop &stop() const { return m_stop; }
 
 private:
     Q_DISABLE_COPY(TreeBuilder)
@@ -128,8 +131,8 @@ private:
         node.begin = takeToken();
         m_open.push_back(std::move(node));
         if (m_open.size() > maximumDepth) {
-            m_faultOffset = m_open.back().begin;
-            m_fault = QString("nested deeper than %1 levels").arg(maximumDepth);
+            m_stop.offset = m_open.back().begin;
+            m_stop.reason = QString("nested deeper than %1 levels").arg(maximumDepth);
             return false;
         }
         return true;
@@ -162,8 +165,7 @@ private:
     const char *const *m_reached;
     std::vector<JsonNode> m_open;
     JsonNode m_root;
-    QString m_fault;
-    int m_faultOffset = 0;
+    JsonStop m_stop;
 };
 
 bool isUtf8(const QByteArray &content)
@@ -193,14 +195,18 @@ bool readJson(const QByteArray &content, const TextIndex &index, JsonNode *root,
         *root = builder.takeRoot();
         return true;
     }
-    fault->at = index.positionOf(builder.faultOffset());
-    if (isUtf8(content)) {
-        fault->message = "not JSON: " + withoutPlace(builder.fault());
-        fault->remedy = "mend it, or name another file.";
-    } else {
+    const JsonStop &stop = builder.stop();
+    if (!isUtf8(content)) {
+        fault->at = index.positionOf(stop.offset);
         fault->message = "not UTF-8";
         fault->remedy = "save the file in the encoding UTF-8.";
+        return false;
     }
+    const JsonHint hint = jsonHint(content, stop);
+    const bool isKnown = !hint.message.isEmpty();
+    fault->at = index.positionOf(isKnown ? hint.offset : stop.offset);
+    fault->message = "not JSON: " + (isKnown ? hint.message : withoutPlace(stop.reason));
+    fault->remedy = isKnown ? hint.remedy : QString("mend it, or name another file.");
     return false;
 }
 

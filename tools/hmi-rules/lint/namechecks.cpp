@@ -1,5 +1,6 @@
 #include "checks.h"
 
+#include "report/visible.h"
 #include "rules/libraryfacts.h"
 #include "rules/names.h"
 
@@ -12,12 +13,14 @@ namespace {
 // What is odd about a name; empty when nothing is.
 QString oddity(const QString &name)
 {
-    const auto isControl = [](QChar c) { return c.category() == QChar::Other_Control; };
-    if (std::any_of(name.cbegin(), name.cend(), isControl)) {
-        return "has a control character";
+    if (std::any_of(name.cbegin(), name.cend(), isInvisible)) {
+        return "has a character that cannot be seen";
     }
-    if (name != name.trimmed()) {
-        return "begins or ends with a space";
+    const QStringList parts = name.split('/');
+    const auto hasSpace = [](const QString &part) { return part != part.trimmed(); };
+    if (std::any_of(parts.cbegin(), parts.cend(), hasSpace)) {
+        return parts.size() == 1 ? "begins or ends with a space"
+                                 : "has a space at an end or beside a slash";
     }
     if (name.startsWith('/') || name.endsWith('/') || name.contains("//")) {
         return "has an empty part beside a slash";

@@ -1,5 +1,7 @@
 #include "lintreport.h"
 
+#include "visible.h"
+
 #include <algorithm>
 
 namespace hmirules {
@@ -22,13 +24,14 @@ QString findingAsText(const ReportedFinding &finding, const Paint &paint)
     const Severity severity = finding.kind->severity;
     QString text = QString("%1: %2: %3 [%4]\n")
                        .arg(paint.bold(placeText(finding.place.file, finding.place.at)),
-                            paint.severity(severity, severityText(severity)), finding.message,
-                            finding.kind->id);
+                            paint.severity(severity, severityText(severity)),
+                            visible(finding.message), finding.kind->id);
     if (!finding.place.pointer.isEmpty()) {
-        text += paint.faint("    at " + finding.place.pointer) + '\n';
+        text += paint.faint("    at " + visible(finding.place.pointer)) + '\n';
     }
     for (const NamedPlace &place : finding.related) {
-        text += QString("    %1: %2\n").arg(placeText(place.file, place.at), place.message);
+        text +=
+            QString("    %1: %2\n").arg(placeText(place.file, place.at), visible(place.message));
     }
     return text + "    Remedy: " + finding.remedy + '\n';
 }

@@ -124,7 +124,8 @@ bool RuleFile::take(const QString &name, const QByteArray &content, Fault *fault
     if (isJson) {
         // A single value is JSON, but not for the library's reader.
         fault->at = m_index.positionOf(m_root.begin);
-        fault->message = "no file of rules";
+        fault->message = "expected an array of entries, found " + typeText(m_root.type);
+        fault->remedy = R"(put the entries into an array: [ { "popup": ... }, ... ].)";
     }
     fault->remedy += onTarget.isEmpty()
         ? QString(" The target takes it, but editors and other tools do not.")
