@@ -43,8 +43,7 @@ private:
 
 void InventoryReader::addPopup(const QString &name, const QString &viewId, int offset)
 {
-    m_inventory->popups.append(
-        {name, viewId, placeText(m_fault->file, m_index.positionOf(offset))});
+    m_inventory->popups.append({name, viewId, m_fault->file, m_index.positionOf(offset)});
 }
 
 bool InventoryReader::refuse(int offset, const QString &message, const QString &remedy)
@@ -187,9 +186,11 @@ bool isConsistent(const Inventory &inventory, Fault *fault)
         const auto known = told.constFind(popup.name);
         if (known != told.constEnd() && known->viewId != popup.viewId) {
             *fault = Fault();
-            fault->file = popup.place;
+            fault->file = popup.file;
+            fault->at = popup.at;
             fault->message = QString(R"(the popup "%1" has the view id "%2" here and "%3" at %4)")
-                                 .arg(popup.name, popup.viewId, known->viewId, known->place);
+                                 .arg(popup.name, popup.viewId, known->viewId,
+                                      placeText(known->file, known->at));
             fault->remedy = "tell one of them, in the inventory or the list of popups.";
             return false;
         }

@@ -14,7 +14,8 @@ struct Inventory
     {
         QString name; ///< of the state
         QString viewId; ///< the name where nothing else is told
-        QString place; ///< where it is told
+        QString file; ///< where it is told
+        TextPosition at;
     };
 
     QList<Popup> popups;
