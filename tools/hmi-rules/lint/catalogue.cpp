@@ -24,13 +24,13 @@ const std::vector<FindingKind> &findingKinds()
          "The rule is passed over with a warning in the log.",
          "Give it the key \"target\" with the name of a popup or a wildcard."},
         {"invalid-behavior", Severity::Error, "The behaviour of a rule is none of the four",
-         "The rule is passed over with a warning in the log; the default decides in its place.",
+         "The rule is passed over with a warning in the log. What is left decides: a rule whose "
+         "target is a wildcard, or the default.",
          "Write Prohibit, Allow, AllowStack or AllowNoReturn."},
         {"invalid-default", Severity::Error,
          "The default of an entry is none of the four behaviours",
-         "It is stored as an invalid behaviour, which acts like Allow and also hides the default "
-         "of "
-         "a wildcard; nothing is logged.",
+         "It is stored as an invalid behaviour, which acts like Allow and also hides the "
+         "default of a wildcard; nothing is logged.",
          "Write Prohibit, Allow, AllowStack or AllowNoReturn, or remove the key."},
         {"invalid-blacklist", Severity::Error, "A blacklist is no array of texts",
          "What is no text is left out, and nothing is logged: the popup is not blocked there.",
@@ -40,56 +40,57 @@ const std::vector<FindingKind> &findingKinds()
         {"contradicting-files", Severity::Error,
          "A later file says something else than an earlier one",
          "Files are loaded one after another, and the last one counts; nothing is logged.",
-         "Keep one of them, or check the files by themselves with --each."},
+         "Keep one of them. Where the later file is meant to replace what the earlier one says, "
+         "name the earlier one as --base; where the two are never loaded together, use --each."},
         {"library-warning", Severity::Error, "The library warned about something else",
          "The log of the target has this warning.", "See what the warning says."},
         {"unknown-key", Severity::Warning, "A key means nothing to the library",
-         "It is passed over, and nothing is logged. Keys are told apart by case.",
+         "It is passed over, and nothing is logged. Small and capital letters make different keys.",
          "Correct or remove the key."},
         {"duplicate-entry", Severity::Warning, "A popup has a second entry",
-         "The rules of both are joined; a default or a blacklist of the later one takes the place "
-         "of "
-         "the earlier one's; nothing is logged.",
+         "The rules of both are joined; a default, a blacklist or a rule for the same target of "
+         "the later one takes the place of the earlier one's; nothing is logged.",
          "Join the two entries into one."},
         {"duplicate-rule", Severity::Warning, "An entry has a second rule for the same target",
          "The last one counts, and nothing is logged.", "Keep one of them."},
         {"shadowed-wildcard", Severity::Warning, "An entry hides a rule of a wildcard's entry",
-         "The rules of one entry alone are searched: its own rules make a popup lose all rules of "
-         "its wildcards, also those for targets that its own entry says nothing about.",
+         "Of all entries that fit a popup, one alone is searched for rules. As this entry has "
+         "rules, those of the wildcard are not asked, not even for targets that it says nothing "
+         "about: there the default decides.",
          "Repeat the hidden rule in the entry, with the behaviour that is wanted."},
         {"never-matches", Severity::Warning, "A name with an asterisk matches no popup",
          "The entry or the rule never decides anything.",
-         "Write a wildcard: */popup for that popup of any module, module/* for any popup of that "
-         "module."},
+         "Write a wildcard: */popup for that popup of any module, module/* for any popup of "
+         "that module."},
         {"unreachable-rule", Severity::Warning, "A rule decides for no pair of popups",
-         "Other rules decide for each pair that it could be for.",
-         "Remove the rule, or those that hide it."},
-        {"mutual-allow", Severity::Warning, "Two popups interrupt each other by rules",
-         "Each makes the other go and return: as long as both are requested, they take turns for "
-         "ever.",
-         "Let one of the two win: Prohibit or AllowNoReturn for one direction."},
+         "Other rules decide for each pair of popups that it could be for.",
+         "Remove the rule, or those that decide in its place."},
         {"refuses-own-return", Severity::Warning, "A stacked popup refuses its own return",
-         "A popup that was interrupted with AllowStack is asked about its own return. When it "
-         "answers Prohibit to itself, it does not come back, and nothing is logged.",
-         "Add a rule with the popup itself as target and the behaviour Allow. Stacked popups are "
-         "looked up by their popup view ids: where these differ, tell them in an inventory."},
+         "All stacked popups are asked about a popup that returns, and one that was interrupted "
+         "with AllowStack is itself among them. When it answers Prohibit to itself it does not "
+         "come back, nothing is logged, and unseen it goes on refusing what it prohibits.",
+         "Add a rule with the popup itself as target and the behaviour Allow. Stacked popups "
+         "are looked up by their popup view ids: where these differ, tell them in an inventory."},
         {"empty-blacklist", Severity::Warning, "A blacklist is empty",
          "An empty list stores nothing: it does not lift the list of a wildcard.",
          "Remove the list; to lift a wildcard's list, name a domain or view that does not matter."},
         {"unknown-popup", Severity::Warning, "A popup is not in the inventory",
-         "The entry or the rule never decides anything.", "Correct the name, or the inventory."},
+         "No popup has just this name: the entry or the rule never decides anything.",
+         "Correct the name, or the inventory."},
         {"unknown-domain", Severity::Warning, "A domain is not in the inventory",
-         "Which number the application gives to an unknown name decides where the popup is "
-         "blocked.",
+         "The application turns names of domains into numbers. What it makes of a name that it "
+         "does not know is its own affair: mostly the popup is not blocked, but it may be so "
+         "elsewhere.",
          "Correct the name, or the inventory."},
         {"unknown-view", Severity::Warning, "A view is not in the inventory",
          "The popup is not blocked by it.", "Correct the name, or the inventory."},
         {"view-id-for-name", Severity::Warning, "Rules are given for a popup view id",
-         "Rules and defaults are looked up by the names of popups. By view ids they are found only "
-         "while the popup is stacked.",
-         "Write the name of the popup."},
+         "Popups in front and requested ones are looked up by their names: there this decides "
+         "nothing. By popup view ids stacked popups alone are looked up, and what they prohibit "
+         "is refused.",
+         "Write the name of the popup, unless this is meant for the time while it is stacked."},
         {"name-for-view-id", Severity::Warning, "A blacklist is given for the name of a popup",
-         "Blacklists are looked up by popup view ids: the popup is never blocked.",
+         "Blacklists are looked up by popup view ids: this one never blocks the popup.",
          "Move the blacklist into an entry for the popup view id."},
         {"suspicious-name", Severity::Warning, "A name is odd",
          "Names are compared as they are, each character counts: it most likely matches nothing.",
@@ -100,9 +101,14 @@ const std::vector<FindingKind> &findingKinds()
         {"overlapping-wildcards", Severity::Note,
          "A popup is under two wildcards that say different things",
          "That popup of any module (*/popup) goes before any popup of that module (module/*), "
-         "whatever "
-         "their order in the file.",
+         "whatever their order in the file.",
          "Name the popup itself, so that nobody has to know which wildcard goes first."},
+        {"mutual-allow", Severity::Note, "Two popups interrupt each other by rules",
+         "Whichever is requested comes up, and the other returns when it has gone. If the "
+         "application requests each of them again as soon as it is hidden, they take turns "
+         "without an end.",
+         "Let one of the two win, with Prohibit or AllowNoReturn for one direction; or leave "
+         "it, where the last request is meant to win."},
         {"empty-interruptions", Severity::Note, "A list of rules is empty",
          "It has no effect: it does not hide the rules of a wildcard.", "Remove it."},
         {"empty-entry", Severity::Note, "An entry says nothing", "It has no effect.",

@@ -71,14 +71,41 @@ public:
             if (toItself.behavior == PopupState::Prohibit && stacking.site >= 0
                 && !m_reported.contains(toItself.site)) {
                 m_reported.insert(toItself.site);
-                m_findings->add("refuses-own-return", m_base.site(toItself.site).place,
-                                '"' + name + "\" answers Prohibit to itself, and may be stacked",
-                                {{m_base.site(stacking.site).place, "AllowStack stacks it"}});
+                const Site &site = m_base.site(toItself.site);
+                m_findings->add("refuses-own-return", site.place, message(name, viewId),
+                                {{m_base.site(stacking.site).place, "AllowStack stacks it"}},
+                                remedy(viewId, site));
             }
         }
     }
 
 private:
+    static QString message(const QString &name, const QString &viewId)
+    {
+        return name == viewId
+            ? QString(R"("%1" can be stacked, and then prohibits its own return)").arg(name)
+            : QString(R"("%1" can be stacked, and then prohibits its own return as "%2")")
+                  .arg(name, viewId);
+    }
+
+    QString remedy(const QString &viewId, const Site &site) const
+    {
+        QString text = QString(R"({ "target": "%1", "behavior": "Allow" })").arg(viewId);
+        if (site.popup != viewId) {
+            text = QString(R"(Give "%1" an entry with the rule %2, and repeat there the rules of )"
+                           R"("%3" that it needs.)")
+                       .arg(viewId, text, site.popup);
+        } else if (site.target == viewId) {
+            text = R"(Write "Allow" in this rule.)";
+        } else {
+            text = QString(R"(Add the rule %1 to the entry "%2".)").arg(text, site.popup);
+        }
+        return m_findings->inventory().hasPopups ? text
+                                                 : text
+                + " No need to where its popup view id is not its name: tell that in an "
+                  "inventory.";
+    }
+
     // A decision by which a popup in front is stacked; without a site when there is none.
     Decision findStacking(const QString &popup) const
     {

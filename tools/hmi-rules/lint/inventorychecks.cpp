@@ -20,16 +20,22 @@ public:
         for (const QString &popup : popups) {
             for (const QString &key : keysOf(popup)) {
                 m_byKey[key].append(popup);
+                if (isWildcard(key)) {
+                    m_wildcards.append(key);
+                }
             }
         }
+        m_wildcards.removeDuplicates();
     }
 
     const QStringList &popups() const { return m_popups; }
+    const QStringList &wildcards() const { return m_wildcards; }
     bool hasAny(const QString &pattern) const { return m_byKey.contains(pattern); }
     QStringList matching(const QString &pattern) const { return m_byKey.value(pattern); }
 
 private:
     QStringList m_popups;
+    QStringList m_wildcards; ///< under which there are popups
     QHash<QString, QStringList> m_byKey;
 };
 
@@ -68,11 +74,8 @@ private:
             reportUnknown(use);
         } else if (!isName && decidesBehavior(use)) {
             reportViewId(use);
-        } else if (!isViewId && hasBlacklist(use)) {
-            const QStringList ids = viewIds(m_names.matching(use.name));
-            m_findings->add("name-for-view-id", use.place,
-                            QString("the blacklist of \"%1\" is looked up by \"%2\"")
-                                .arg(use.name, ids.join("\", \"")));
+        } else if (use.role == NameUse::Entry) {
+            reportMissed(use);
         }
     }
 
@@ -82,28 +85,46 @@ private:
             || !m_table.sitesOf(use.name, Site::Default).empty();
     }
 
-    bool hasBlacklist(const NameUse &use) const
+    bool hasList(const QString &key, Site::Kind kind) const
     {
-        return use.role == NameUse::Entry
-            && (!m_table.sitesOf(use.name, Site::DomainBlacklist).empty()
-                || !m_table.sitesOf(use.name, Site::ViewBlacklist).empty());
+        return !m_table.sitesOf(key, kind).empty();
     }
 
-    QStringList viewIds(const QStringList &names) const
+    // Whether a blacklist of an entry is meant for a popup that is looked up elsewhere. Under its
+    // popup view id it may have a list in place of a wildcard's.
+    bool isMissed(const QString &viewId, const QString &pattern, Site::Kind kind) const
     {
-        QStringList ids;
-        for (const QString &name : names) {
-            ids.append(m_findings->inventory().viewIdOf(name));
+        const QStringList keys = keysOf(viewId);
+        const bool hasOther = isWildcard(pattern)
+            && std::any_of(keys.cbegin(), keys.cend(),
+                           [this, kind](const QString &key) { return hasList(key, kind); });
+        return hasList(pattern, kind) && !matches(pattern, viewId) && !hasOther;
+    }
+
+    void reportMissed(const NameUse &use)
+    {
+        QStringList missed;
+        for (const QString &name : m_names.matching(use.name)) {
+            const QString viewId = m_findings->inventory().viewIdOf(name);
+            if (isMissed(viewId, use.name, Site::DomainBlacklist)
+                || isMissed(viewId, use.name, Site::ViewBlacklist)) {
+                missed.append(QString(R"("%1" (popup view id "%2"))").arg(name, viewId));
+            }
         }
-        return ids;
+        if (!missed.isEmpty()) {
+            m_findings->add("name-for-view-id", use.place,
+                            QString(R"(the blacklist of "%1" does not block %2)")
+                                .arg(use.name, missed.join(", ")));
+        }
     }
 
     void reportUnknown(const NameUse &use)
     {
         if (isWildcard(use.name)) {
             m_findings->add("never-matches", use.place,
-                            "no popup of the inventory is under \"" + use.name + '"', {},
-                            "Correct the wildcard, or the inventory.");
+                            "no popup of the inventory is under \"" + use.name + '"'
+                                + didYouMean(use.name, m_names.wildcards()),
+                            {}, "Correct the wildcard, or the inventory.");
         } else if (!use.name.contains('*')) { // otherwise that has been told
             m_findings->add("unknown-popup", use.place,
                             "no popup \"" + use.name + "\" is in the inventory"
@@ -138,7 +159,7 @@ private:
                             QString("the rule of \"%1\" for \"%2\" decides for no two popups of "
                                     "the inventory")
                                 .arg(rule.popup, rule.target),
-                            exampleOfHiding(rule));
+                            deciding(rule));
         }
     }
 
@@ -154,16 +175,26 @@ private:
         });
     }
 
-    std::vector<Related> exampleOfHiding(const Site &rule) const
+    // What decides in its place, each with the first pair for which it does.
+    std::vector<Related> deciding(const Site &rule) const
     {
-        const QString front = m_names.matching(rule.popup).value(0);
-        const QString requested = m_names.matching(rule.target).value(0);
-        const Decision decision = m_base.decision(front, requested);
-        if (decision.site < 0) {
-            return {};
+        std::vector<Related> related;
+        QSet<int> told = {-1};
+        const QStringList fronts = m_names.matching(rule.popup);
+        const QStringList requested = m_names.matching(rule.target);
+        for (const QString &front : fronts) {
+            for (const QString &popup : requested) {
+                const int site = m_base.decision(front, popup).site;
+                if (!told.contains(site)) {
+                    related.push_back(
+                        {m_base.site(site).place,
+                         QString(R"(this one decides for "%1" in front and "%2" requested)")
+                             .arg(front, popup)});
+                }
+                told.insert(site);
+            }
         }
-        return {{m_base.site(decision.site).place,
-                 QString("decides for \"%1\" in front and \"%2\"").arg(front, requested)}};
+        return related;
     }
 
     void checkMentioned(const QString &popup)

@@ -42,13 +42,17 @@ void addRule(const RuleFile &file, int index, int ruleIndex, const char *key, co
     const JsonNode &rule = entry.array("interruptions")[static_cast<std::size_t>(ruleIndex)];
     const QString pointer = QString("/%1/interruptions/%2").arg(index).arg(ruleIndex);
     const JsonNode *value = rule.value(key);
-    const bool isRule = rule.type == JsonNode::Object;
+    if (rule.type != JsonNode::Object) {
+        findings->add(id, file.place(pointer, rule), "expected a rule, found " + found(&rule), {},
+                      R"(Write an object: { "target": "car/fuel", "behavior": "Prohibit" }.)");
+        return;
+    }
     const QString guess = value ? didYouMean(value->text, behaviors) : QString();
     findings->add(
         id, value ? file.place(pointer + '/' + key, *value) : file.place(pointer, rule),
         QString("expected %1, found %2")
                 .arg(qstrcmp(key, "target") == 0 ? "the name of a requested popup" : "a behaviour",
-                     found(isRule ? value : &rule))
+                     found(value))
             + (qstrcmp(key, "behavior") == 0 ? guess : QString()));
 }
 
