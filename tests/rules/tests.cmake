@@ -66,3 +66,16 @@ set_tests_properties(rules-page-make PROPERTIES FIXTURES_SETUP rules_page)
 set_tests_properties(rules-page-made PROPERTIES FIXTURES_REQUIRED rules_page)
 set_tests_properties(rules-page rules-page-make rules-page-made PROPERTIES
     LABELS rules TIMEOUT 120)
+
+# hmi-rules run in the test's own process, compared with the files that are listed in a folder.
+add_library(hmi_rules_goldens STATIC rules/goldens.cpp rules/goldens.h)
+hmi_target_defaults(hmi_rules_goldens)
+target_include_directories(hmi_rules_goldens PUBLIC ${CMAKE_CURRENT_SOURCE_DIR}/rules)
+target_link_libraries(hmi_rules_goldens PUBLIC hmi_rules_parts Qt5::Test)
+set(HMI_DATA_OF_lintcases ${CMAKE_CURRENT_SOURCE_DIR}/rules/lint)
+set(HMI_DATA_OF_lintcompleteness ${CMAKE_CURRENT_SOURCE_DIR}/data/interruptions)
+foreach(name IN ITEMS lintcases lintcompleteness)
+    hmi_add_test(rules ${name})
+    target_link_libraries(tst_${name} PRIVATE hmi_rules_goldens)
+    target_compile_definitions(tst_${name} PRIVATE HMI_TEST_DATA_DIR="${HMI_DATA_OF_${name}}")
+endforeach()
