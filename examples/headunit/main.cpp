@@ -1,5 +1,6 @@
 #include "flow/flow.h"
 #include "hardkeys.h"
+#include "inventory.h"
 #include "messages.h"
 #include "options.h"
 #include "rules.h"
@@ -152,6 +153,10 @@ int drive(const Options &options)
         write(stdout, viewStateNames().join('\n'));
         return Success;
     }
+    if (options.inventory) {
+        write(stdout, inventory());
+        return Success;
+    }
     const Stage stage{&vehicle, &keys, &viewLayer, &transcript};
     const ExitCode code =
         options.scenario.isEmpty() ? driveByHand(options, stage) : driveScenario(options, stage);
@@ -173,7 +178,8 @@ bool isHeadless(int argc, char *argv[])
     const auto skipsScene = [](const char *argument) {
         const QLatin1String text(argument);
         return text == QLatin1String("--headless") || text == QLatin1String("--list")
-            || text == QLatin1String("--help") || text == QLatin1String("-h");
+            || text == QLatin1String("--inventory") || text == QLatin1String("--help")
+            || text == QLatin1String("-h");
     };
     return std::any_of(argv + 1, argv + argc, skipsScene);
 }

@@ -24,6 +24,8 @@ const QCommandLineOption rulesOption("rules", "The popups' rules, in place of th
                                      "FILE", builtInRules());
 const QCommandLineOption firstStartOption("first-start", "Start as out of the factory.");
 const QCommandLineOption listOption("list", "List the views and exit.");
+const QCommandLineOption inventoryOption(
+    "inventory", "Print the popups, domains and views for hmi-rules and exit.");
 const QCommandLineOption verboseOption("verbose", "Show the library's debug messages.");
 const QCommandLineOption helpOption({"h", "help"}, "Show this help and exit.");
 
@@ -35,14 +37,18 @@ void describe(QCommandLineParser *parser)
         "A scenario is a text file, one command a line:\n"
         + commandHelp());
     parser->addOptions({scenarioOption, headlessOption, screenshotsOption, paceOption, panelsOption,
-                        rulesOption, firstStartOption, listOption, verboseOption, helpOption});
+                        rulesOption, firstStartOption, listOption, inventoryOption, verboseOption,
+                        helpOption});
     parser->addPositionalArgument("FILE", "The scenario to run.", "[FILE]");
 }
 
 // What is wrong with the combination of options; empty when nothing is.
 QString contradiction(const QCommandLineParser &parser, const QStringList &files)
 {
-    const bool list = parser.isSet(listOption);
+    if (parser.isSet(listOption) && parser.isSet(inventoryOption)) {
+        return "expected --list or --inventory, found both";
+    }
+    const bool list = parser.isSet(listOption) || parser.isSet(inventoryOption);
     const bool headless = parser.isSet(headlessOption);
     const int wanted = list ? 0 : 1;
     if (files.size() > wanted || (headless && files.size() < wanted)) {
@@ -103,6 +109,7 @@ QString parseOptions(const QStringList &arguments, Options *options)
     options->rules = parser.value(rulesOption);
     options->firstStart = parser.isSet(firstStartOption);
     options->list = parser.isSet(listOption);
+    options->inventory = parser.isSet(inventoryOption);
     options->verbose = parser.isSet(verboseOption);
     return QString();
 }

@@ -16,6 +16,7 @@ struct Options
     QString rules; ///< a file
     bool firstStart = false;
     bool list = false;
+    bool inventory = false;
     bool verbose = false;
     bool help = false;
 };

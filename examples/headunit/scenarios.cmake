@@ -76,6 +76,25 @@ hmi_add_output_test(headunit-list
     COMMAND headunit --headless --list
     EXPECTED ${CMAKE_CURRENT_SOURCE_DIR}/tests/list.expected
     LABELS examples)
+hmi_add_output_test(headunit-inventory
+    COMMAND headunit --headless --inventory
+    EXPECTED ${CMAKE_CURRENT_SOURCE_DIR}/inventory.json
+    LABELS examples)
+
+# The rules are without a fault, whether it is known what they are for or not.
+if(HMISTATEMACHINE_WITH_RULES_TOOL)
+    hmi_add_output_test(headunit-rules
+        COMMAND hmi-rules lint --fail-on note interruptions.json
+        EXPECTED ${CMAKE_CURRENT_SOURCE_DIR}/tests/no-findings.expected
+        LABELS examples)
+    hmi_add_output_test(headunit-rules-inventory
+        COMMAND hmi-rules lint --fail-on note --inventory inventory.json interruptions.json
+        EXPECTED ${CMAKE_CURRENT_SOURCE_DIR}/tests/no-findings.expected
+        LABELS examples)
+else()
+    message(STATUS "Tests of the head unit's rules: off, because they need hmi-rules")
+endif()
+
 add_test(NAME headunit-help COMMAND headunit --headless --help)
 add_test(NAME headunit-verbose COMMAND headunit --headless --verbose ${scenarios_dir}/voice.scenario)
 set_tests_properties(headunit-help headunit-verbose PROPERTIES LABELS examples TIMEOUT 30)
