@@ -13,6 +13,9 @@ namespace hmirules {
 
 namespace {
 
+constexpr char whenInFront[] = "Not asked while it is in front: it is given the new data. Asked "
+                               "when it is stacked, see below.";
+
 /** Writes the parts of an explanation one below the other. */
 class TextWriter
 {
@@ -27,7 +30,9 @@ public:
         line(QString(R"("%1" is in front, "%2" is requested: %3)")
                  .arg(explanation.front, explanation.requested,
                       m_paint.behavior(behavior, m_paint.bold(behaviorText(behavior)))));
-        line("    " + effectText(behavior) + '.');
+        line("    "
+             + (explanation.front == explanation.requested ? QString(whenInFront)
+                                                           : effectText(behavior) + '.'));
         line("Decided by: " + reasonText(m_base, explanation.decision));
         writePlace(explanation.decision.site);
     }
@@ -78,11 +83,13 @@ public:
                  .arg(blocking.popupViewId,
                       m_paint.bold(blocking.blocking.isBlocked ? "blocked" : "not blocked"),
                       byDomain ? "in the domain" : "by the view", blocking.where));
-        line(byDomain
-                 ? "    A request is refused there, and a shown popup is hidden while the domain "
-                   "is active."
-                 : "    A shown popup is hidden when the view becomes active; requests are not "
-                   "affected.");
+        if (blocking.blocking.isBlocked) {
+            line(byDomain
+                     ? "    A request is refused there, and a shown popup is hidden while the "
+                       "domain is active."
+                     : "    A shown popup is hidden when the view becomes active; requests are not "
+                       "affected.");
+        }
         line("Decided by: "
              + (blocking.blocking.site < 0 ? QString("no list")
                                            : siteText(m_base.site(blocking.blocking.site))));

@@ -12,9 +12,10 @@ QString effectText(int behavior)
     case PopupState::Prohibit:
         return "the request is refused";
     case PopupState::Allow:
-        return "the popup in front goes and returns afterwards";
+        return "the popup in front goes and returns afterwards; one of another layer stays as it "
+               "is";
     case PopupState::AllowStack:
-        return "the popup in front waits beneath and stays stacked";
+        return "the popup in front goes behind the requested one, stacked, and returns afterwards";
     case PopupState::AllowNoReturn:
         return "the popup in front goes for good";
     default:
