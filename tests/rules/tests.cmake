@@ -74,8 +74,13 @@ target_include_directories(hmi_rules_goldens PUBLIC ${CMAKE_CURRENT_SOURCE_DIR}/
 target_link_libraries(hmi_rules_goldens PUBLIC hmi_rules_parts Qt5::Test)
 set(HMI_DATA_OF_lintcases ${CMAKE_CURRENT_SOURCE_DIR}/rules/lint)
 set(HMI_DATA_OF_lintcompleteness ${CMAKE_CURRENT_SOURCE_DIR}/data/interruptions)
-foreach(name IN ITEMS lintcases lintcompleteness)
+set(HMI_DATA_OF_sarif ${CMAKE_CURRENT_SOURCE_DIR}/rules/output)
+set(HMI_DATA_OF_toolcases ${CMAKE_CURRENT_SOURCE_DIR}/rules/output)
+foreach(name IN ITEMS lintcases lintcompleteness sarif toolcases)
     hmi_add_test(rules ${name})
     target_link_libraries(tst_${name} PRIVATE hmi_rules_goldens)
     target_compile_definitions(tst_${name} PRIVATE HMI_TEST_DATA_DIR="${HMI_DATA_OF_${name}}")
 endforeach()
+target_compile_definitions(tst_toolcases PRIVATE
+    HMI_POPUP_RULES_PAGE="${PROJECT_SOURCE_DIR}/docs/popup-rules.md"
+    HMI_RULES_SCHEMA="${PROJECT_SOURCE_DIR}/tools/hmi-rules/schema/popup-interruptions.schema.json")
