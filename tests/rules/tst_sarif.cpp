@@ -55,6 +55,7 @@ void tst_Sarif::hasWhatReadersNeed_data()
     QTest::addColumn<bool>("successful");
     QTest::newRow("several findings")
         << QStringList({"--inventory", "several.inventory.json", "several.json"}) << 9 << true;
+    QTest::newRow("at the beginning") << QStringList("inventory.json") << 1 << true;
     QTest::newRow("several files")
         << QStringList({"--base", "rules.json", "rules-new.json", "name with blanks & é#1.json"})
         << 1 << true;
