@@ -65,6 +65,12 @@ const std::vector<FindingKind> &findingKinds()
         {"unreachable-rule", Severity::Warning, "A rule decides for no pair of popups",
          "Other rules decide for each pair of popups that it could be for.",
          "Remove the rule, or those that decide in its place."},
+        {"mutual-allow", Severity::Warning, "Two popups interrupt each other by rules",
+         "Whichever is requested comes up, and the other returns when it has gone. If the "
+         "application requests each of them again as soon as it is hidden, they take turns "
+         "without an end.",
+         "Let one of the two win, with Prohibit or AllowNoReturn for one direction; or leave "
+         "it, where the last request is meant to win."},
         {"refuses-own-return", Severity::Warning, "A stacked popup refuses its own return",
          "All stacked popups are asked about a popup that returns, and one that was interrupted "
          "with AllowStack is itself among them. When it answers Prohibit to itself it does not "
@@ -103,12 +109,6 @@ const std::vector<FindingKind> &findingKinds()
          "That popup of any module (*/popup) goes before any popup of that module (module/*), "
          "whatever their order in the file.",
          "Name the popup itself, so that nobody has to know which wildcard goes first."},
-        {"mutual-allow", Severity::Note, "Two popups interrupt each other by rules",
-         "Whichever is requested comes up, and the other returns when it has gone. If the "
-         "application requests each of them again as soon as it is hidden, they take turns "
-         "without an end.",
-         "Let one of the two win, with Prohibit or AllowNoReturn for one direction; or leave "
-         "it, where the last request is meant to win."},
         {"empty-interruptions", Severity::Note, "A list of rules is empty",
          "It has no effect: it does not hide the rules of a wildcard.", "Remove it."},
         {"empty-entry", Severity::Note, "An entry says nothing", "It has no effect.",
