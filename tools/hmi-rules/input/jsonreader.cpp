@@ -4,6 +4,8 @@
 
 #include <nlohmann/json.hpp>
 
+#include <QJsonArray>
+#include <QJsonDocument>
 #include <QTextCodec>
 
 #include <algorithm>
@@ -15,6 +17,25 @@ namespace hmirules {
 namespace {
 
 constexpr std::size_t maximumDepth = 1024; // QJsonDocument's own limit
+
+constexpr char byteOrderMark[] = "\xef\xbb\xbf";
+
+// With a byte order mark in front, which QString would take for one.
+QString toKey(const std::string &text)
+{
+    const bool hasMark = text.compare(0, std::strlen(byteOrderMark), byteOrderMark) == 0;
+    return (hasMark ? QString(QChar(QChar::ByteOrderMark)) : QString())
+        + QString::fromStdString(text);
+}
+
+// QJsonDocument leaves a byte order mark in front out, unless there is an escape in the text.
+QString toValue(const std::string &text, const QByteArray &token)
+{
+    const QString asKey = toKey(text);
+    return asKey.startsWith(QChar(QChar::ByteOrderMark))
+        ? QJsonDocument::fromJson('[' + token + ']').array().first().toString()
+        : asKey;
+}
 
 /** Tells how far the reader has come, which its events do not. */
 class Cursor
@@ -50,19 +71,21 @@ public:
         : m_begin(content.constData()), m_end(m_begin + content.size()), m_tokenEnd(m_begin),
           m_reached(reached)
     {
-        if (content.startsWith("\xef\xbb\xbf")) {
+        if (content.startsWith(byteOrderMark)) {
             m_tokenEnd += 3;
         }
     }
 
-    bool null() override { return scalar(JsonNode::Null); }
-    bool boolean(bool) override { return scalar(JsonNode::Bool); }
+    bool null() override { return scalar(JsonNode::Null, takeToken()); }
+    bool boolean(bool) override { return scalar(JsonNode::Bool, takeToken()); }
     bool number_integer(number_integer_t) override { return number(); }
     bool number_unsigned(number_unsigned_t) override { return number(); }
     bool number_float(number_float_t, const string_t &) override { return number(); }
     bool string(string_t &text) override
     {
-        return scalar(JsonNode::String, QString::fromStdString(text));
+        const int begin = takeToken();
+        const QByteArray token(m_begin + begin, reachedOffset() - begin);
+        return scalar(JsonNode::String, begin, toValue(text, token));
     }
     bool binary(binary_t &) override { return false; } // no text has it
     bool start_object(std::size_t) override { return open(JsonNode::Object); }
@@ -72,7 +95,7 @@ public:
     bool key(string_t &text) override
     {
         const int begin = takeToken();
-        m_open.back().members.push_back({QString::fromStdString(text), begin, JsonNode()});
+        m_open.back().members.push_back({toKey(text), begin, JsonNode()});
         return true;
     }
     bool parse_error(std::size_t position, const std::string &,
@@ -103,12 +126,12 @@ private:
 
     int reachedOffset() const { return static_cast<int>(m_tokenEnd - m_begin); }
 
-    bool scalar(JsonNode::Type type, const QString &text = QString())
+    bool scalar(JsonNode::Type type, int begin, const QString &text = QString())
     {
         JsonNode node;
         node.type = type;
         node.text = text;
-        node.begin = takeToken();
+        node.begin = begin;
         node.end = reachedOffset();
         append(std::move(node));
         return true;
@@ -117,7 +140,7 @@ private:
     // A number ends where the next character does not belong to it, which has been read by then.
     bool number()
     {
-        scalar(JsonNode::Number);
+        scalar(JsonNode::Number, takeToken());
         if (!std::strchr("0123456789+-.eE", m_tokenEnd[-1])) {
             --m_tokenEnd;
         }
