@@ -140,11 +140,11 @@ private:
     // A number ends where the next character does not belong to it, which has been read by then.
     bool number()
     {
-        scalar(JsonNode::Number, takeToken());
+        const int begin = takeToken();
         if (!std::strchr("0123456789+-.eE", m_tokenEnd[-1])) {
             --m_tokenEnd;
         }
-        return true;
+        return scalar(JsonNode::Number, begin);
     }
 
     bool open(JsonNode::Type type)
