@@ -84,3 +84,34 @@ endforeach()
 target_compile_definitions(tst_toolcases PRIVATE
     HMI_POPUP_RULES_PAGE="${PROJECT_SOURCE_DIR}/docs/popup-rules.md"
     HMI_RULES_SCHEMA="${PROJECT_SOURCE_DIR}/tools/hmi-rules/schema/popup-interruptions.schema.json")
+
+execute_process(COMMAND ${HMI_TEST_PYTHON} -c "import selenium"
+    RESULT_VARIABLE without_selenium OUTPUT_QUIET ERROR_QUIET)
+if(without_selenium)
+    message(FATAL_ERROR "${HMI_TEST_PYTHON} has no module selenium for the test of the page")
+endif()
+add_test(NAME rules-page COMMAND ${HMI_TEST_PYTHON} -B
+    ${CMAKE_CURRENT_LIST_DIR}/page/page_test.py
+    --chromium ${HMI_TEST_CHROMIUM}
+    --chromedriver ${HMI_TEST_CHROMEDRIVER}
+    --parts ${PROJECT_SOURCE_DIR}/tools/hmi-rules/matrix/page)
+set_tests_properties(rules-page PROPERTIES LABELS rules TIMEOUT 120)
+# Files of rules made at random, and what must hold for any of them.
+foreach(name IN ITEMS rulesproperty rulespropertydiff rulespropertyreports)
+    hmi_add_test(rules ${name})
+    target_sources(tst_${name} PRIVATE
+        random/seeds.cpp
+        random/seeds.h
+        rules/random/rulemaker.cpp
+        rules/random/rulemaker.h
+        rules/random/stores.cpp
+        rules/random/stores.h)
+    target_link_libraries(tst_${name} PRIVATE hmi_rules_parts)
+    set_tests_properties(${name} PROPERTIES TIMEOUT 120)
+    if(HMISTATEMACHINE_SANITIZE)
+        set_tests_properties(${name} PROPERTIES ENVIRONMENT HMI_RANDOM_STEPS=10)
+    endif()
+endforeach()
+target_sources(tst_rulesproperty PRIVATE
+    rules/random/decisioncase.cpp
+    rules/random/decisioncase.h)
