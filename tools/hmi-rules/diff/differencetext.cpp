@@ -2,6 +2,7 @@
 
 #include "report/json.h"
 #include "report/sitetext.h"
+#include "report/visible.h"
 #include "rules/libraryfacts.h"
 
 namespace hmirules {
@@ -53,20 +54,20 @@ QString differenceAsText(const RuleBase &before, const RuleBase &after,
     for (const ChangedDecision &change : difference.decisions) {
         if (change.front != front) {
             front = change.front;
-            text += paint.bold('"' + front + "\" in front") + '\n';
+            text += paint.bold('"' + visible(front) + "\" in front") + '\n';
         }
         text += QString("    \"%1\" requested: %2 -> %3\n")
-                    .arg(change.requested, painted(change.before.behavior, paint),
+                    .arg(visible(change.requested), painted(change.before.behavior, paint),
                          painted(change.after.behavior, paint));
         text += "        was " + why(before, change.before.site, noRule) + '\n';
         text += "        is " + why(after, change.after.site, noRule) + '\n';
     }
     for (const ChangedBlocking &change : difference.blockings) {
         text += QString("\"%1\" %2 %3 \"%4\"\n")
-                    .arg(change.popupViewId,
+                    .arg(visible(change.popupViewId),
                          change.after.isBlocked ? "is now blocked" : "is no longer blocked",
                          change.kind == Site::DomainBlacklist ? "in the domain" : "by the view",
-                         change.where);
+                         visible(change.where));
         text += "        was " + why(before, change.before.site, "no list") + '\n';
         text += "        is " + why(after, change.after.site, "no list") + '\n';
     }

@@ -1,6 +1,7 @@
 #include "explanationtext.h"
 
 #include "report/sitetext.h"
+#include "report/visible.h"
 #include "rules/libraryfacts.h"
 
 #include <HmiStateMachine/popup/popupstate.h>
@@ -28,7 +29,7 @@ public:
     {
         const int behavior = explanation.decision.behavior;
         line(QString(R"("%1" is in front, "%2" is requested: %3)")
-                 .arg(explanation.front, explanation.requested,
+                 .arg(visible(explanation.front), visible(explanation.requested),
                       m_paint.behavior(behavior, m_paint.bold(behaviorText(behavior)))));
         line("    "
              + (explanation.front == explanation.requested ? QString(whenInFront)
@@ -43,12 +44,14 @@ public:
         line(m_paint.bold(title));
         int width = 0;
         for (const KeyTried &key : keys) {
-            width = std::max(width, key.key.size());
+            width = std::max(width, visible(key.key).size());
         }
         for (const KeyTried &key : keys) {
             const QString what = key.sites.empty() ? nothing : summary(key.sites);
-            line(
-                QString("  %1 %2  %3").arg(key.isTaken ? '*' : ' ').arg(key.key, -width).arg(what));
+            line(QString("  %1 %2  %3")
+                     .arg(key.isTaken ? '*' : ' ')
+                     .arg(visible(key.key), -width)
+                     .arg(what));
         }
     }
 
@@ -68,9 +71,9 @@ public:
     {
         line(QString());
         line(QString(R"(While "%1" is stacked, it %2 "%3"%4)")
-                 .arg(explanation.front,
+                 .arg(visible(explanation.front),
                       explanation.whileStacked == PopupState::Prohibit ? "refuses" : "lets through",
-                      explanation.requested,
+                      visible(explanation.requested),
                       explanation.whileStacked == PopupState::Prohibit ? ", and nothing is logged."
                                                                        : "."));
     }
@@ -80,9 +83,9 @@ public:
         const bool byDomain = blocking.kind == Site::DomainBlacklist;
         line(QString());
         line(QString(R"("%1" is %2 %3 "%4")")
-                 .arg(blocking.popupViewId,
+                 .arg(visible(blocking.popupViewId),
                       m_paint.bold(blocking.blocking.isBlocked ? "blocked" : "not blocked"),
-                      byDomain ? "in the domain" : "by the view", blocking.where));
+                      byDomain ? "in the domain" : "by the view", visible(blocking.where)));
         if (blocking.blocking.isBlocked) {
             line(byDomain
                      ? "    A request is refused there, and a shown popup is hidden while the "
@@ -109,6 +112,11 @@ private:
         }
     }
 
+    static QString says(const Site &site)
+    {
+        return visible(site.names.isEmpty() ? site.text : site.names.join(", "));
+    }
+
     QString summary(const std::vector<int> &sites) const
     {
         const Site &first = m_base.site(sites.front());
@@ -116,14 +124,14 @@ private:
         if (sites.size() > 1) {
             return QString("%1 rules, the first at %2").arg(sites.size()).arg(place);
         }
-        return (first.names.isEmpty() ? first.text : first.names.join(", ")) + " at " + place;
+        return says(first) + " at " + place;
     }
 
     QString describe(int number) const
     {
         const Site &site = m_base.site(number);
-        const QString says = site.names.isEmpty() ? site.text : site.names.join(", ");
-        return QString("%1 by the %2 at %3").arg(says, siteText(site), sitePlace(m_base, site));
+        return QString("%1 by the %2 at %3")
+            .arg(says(site), siteText(site), sitePlace(m_base, site));
     }
 
     const RuleBase &m_base;

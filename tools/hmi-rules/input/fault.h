@@ -23,7 +23,7 @@ struct Fault
 /** The line for people: place, message and remedy. */
 QString toText(const Fault &fault);
 
-/** "file:line:column", or the file alone. */
+/** "file:line:column", or the file alone, for people. */
 QString placeText(const QString &file, const TextPosition &at);
 
 } // namespace hmirules

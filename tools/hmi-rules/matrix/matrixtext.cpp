@@ -1,6 +1,7 @@
 #include "matrixtext.h"
 
 #include "report/sitetext.h"
+#include "report/visible.h"
 #include "rules/libraryfacts.h"
 
 #include <HmiStateMachine/popup/popupstate.h>
@@ -57,7 +58,7 @@ public:
         m_numberWidth = QString::number(matrix.popups.size()).size();
         m_cellWidth = std::max(m_cellWidth, m_numberWidth);
         for (const Individual &popup : matrix.popups) {
-            m_nameWidth = std::max(m_nameWidth, popup.name.size());
+            m_nameWidth = std::max(m_nameWidth, visible(popup.name).size());
         }
     }
 
@@ -91,7 +92,7 @@ private:
         if (m_base.files().size() > 1) {
             int number = 1;
             for (const RuleFile &file : m_base.files()) {
-                m_text += QString("%1: %2\n").arg(number++).arg(file.name());
+                m_text += QString("%1: %2\n").arg(number++).arg(visible(file.name()));
             }
         }
         m_text += '\n';
@@ -110,7 +111,7 @@ private:
     {
         QString line = QString("%1 %2")
                            .arg(row + 1, m_numberWidth)
-                           .arg(m_matrix.popups.at(row).name, -m_nameWidth);
+                           .arg(visible(m_matrix.popups.at(row).name), -m_nameWidth);
         for (const int reason : m_matrix.cells[static_cast<std::size_t>(row)]) {
             const QString &cell = m_cells.at(reason);
             const Decision &decision = m_matrix.reasons[static_cast<std::size_t>(reason)];
@@ -140,7 +141,7 @@ private:
             return QString();
         }
         return QString("    %1 %2 %3 (%4)\n")
-            .arg(m_matrix.popups.at(row).viewId, where, blocked.names.join(", "),
+            .arg(visible(m_matrix.popups.at(row).viewId), where, visible(blocked.names.join(", ")),
                  sitePlace(m_base, m_base.site(blocked.site)));
     }
 

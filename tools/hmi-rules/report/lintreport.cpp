@@ -33,7 +33,7 @@ QString findingAsText(const ReportedFinding &finding, const Paint &paint)
         text +=
             QString("    %1: %2\n").arg(placeText(place.file, place.at), visible(place.message));
     }
-    return text + "    Remedy: " + finding.remedy + '\n';
+    return text + "    Remedy: " + visible(finding.remedy) + '\n';
 }
 
 } // namespace

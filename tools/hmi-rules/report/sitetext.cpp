@@ -1,5 +1,7 @@
 #include "sitetext.h"
 
+#include "visible.h"
+
 #include <HmiStateMachine/popup/popupstate.h>
 
 using HmiStateMachine::PopupState;
@@ -27,15 +29,16 @@ QString siteText(const Site &site)
 {
     switch (site.kind) {
     case Site::Rule:
-        return QString(R"(rule for "%1" in the entry "%2")").arg(site.target, site.popup);
+        return QString(R"(rule for "%1" in the entry "%2")")
+            .arg(visible(site.target), visible(site.popup));
     case Site::Default:
-        return QString(R"(default of the entry "%1")").arg(site.popup);
+        return QString(R"(default of the entry "%1")").arg(visible(site.popup));
     case Site::DomainBlacklist:
-        return QString(R"(domain blacklist of the entry "%1")").arg(site.popup);
+        return QString(R"(domain blacklist of the entry "%1")").arg(visible(site.popup));
     case Site::ViewBlacklist:
         break;
     }
-    return QString(R"(view blacklist of the entry "%1")").arg(site.popup);
+    return QString(R"(view blacklist of the entry "%1")").arg(visible(site.popup));
 }
 
 QString reasonText(const RuleBase &base, const Decision &decision)
