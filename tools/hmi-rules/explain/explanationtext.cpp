@@ -48,10 +48,8 @@ public:
         }
         for (const KeyTried &key : keys) {
             const QString what = key.sites.empty() ? nothing : summary(key.sites);
-            line(QString("  %1 %2  %3")
-                     .arg(key.isTaken ? '*' : ' ')
-                     .arg(visible(key.key), -width)
-                     .arg(what));
+            line(QString("  ") + (key.isTaken ? '*' : ' ') + ' '
+                 + visible(key.key).leftJustified(width) + "  " + what);
         }
     }
 

@@ -176,11 +176,8 @@ QString placeFields(const RuleBase &base, int site)
         return ",,,";
     }
     const Place &place = base.site(site).place;
-    return QString("%1,%2,%3,%4")
-        .arg(field(fileName(base, place)))
-        .arg(place.at.line)
-        .arg(place.at.column)
-        .arg(field(place.pointer));
+    return field(fileName(base, place)) + QString(",%1,%2,").arg(place.at.line).arg(place.at.column)
+        + field(place.pointer);
 }
 
 QString decidedBy(const RuleBase &base, const Decision &decision)
