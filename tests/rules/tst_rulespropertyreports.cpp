@@ -3,6 +3,8 @@
 
 #include "explain/explanationtext.h"
 #include "matrix/matrixtext.h"
+#include "report/sitetext.h"
+#include "report/visible.h"
 #include "rules/libraryfacts.h"
 #include "rules/names.h"
 
@@ -20,7 +22,7 @@ using namespace hmirules;
 
 namespace {
 
-constexpr int defaultRuns = 25;
+constexpr int defaultRuns = 12;
 
 QString keyTaken(const std::vector<KeyTried> &keys)
 {
@@ -142,8 +144,19 @@ bool isJsonRight(const RuleBase &base, const Explanation &explanation)
 bool isTextRight(const RuleBase &base, const Explanation &explanation)
 {
     const QString text = explanationAsText(base, explanation, {}, Paint(false));
-    return text.section('\n', 0, 0)
-        .endsWith("is requested: " + behaviorText(explanation.decision.behavior));
+    QStringList lines;
+    for (const auto &keys :
+         {explanation.ruleKeys, explanation.targetKeys, explanation.defaultKeys}) {
+        for (const KeyTried &key : keys) {
+            lines.append((key.isTaken ? "  * " : "    ") + visible(key.key));
+        }
+    }
+    const auto isWritten = [&text](const QString &line) {
+        return text.contains('\n' + line + ' ');
+    };
+    return std::all_of(lines.cbegin(), lines.cend(), isWritten)
+        && text.section('\n', 0, 0)
+               .endsWith("is requested: " + behaviorText(explanation.decision.behavior));
 }
 
 QString firstWrongExplanation(const RuleBase &base)
@@ -237,11 +250,14 @@ private:
 
     bool isLineRight(const QStringList &line, int row, int column) const
     {
-        const int site = decision(row, column).site;
+        const int number = decision(row, column).site;
+        const Place place = number < 0 ? Place() : m_base.site(number).place;
         return line.size() == 9 && line.at(0) == m_popups.at(row).name
             && line.at(1) == m_popups.at(column).name
             && line.at(2) == behaviorText(answer(row, column))
-            && line.at(5) == (site < 0 ? "" : QString::number(m_base.site(site).place.at.line));
+            && line.at(4) == (number < 0 ? "" : fileName(m_base, place))
+            && line.at(5) == (number < 0 ? "" : QString::number(place.at.line))
+            && line.at(7) == place.pointer;
     }
 
     bool isLetterRight(const QString &cell, int row, int column) const

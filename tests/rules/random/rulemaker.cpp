@@ -31,6 +31,7 @@ const QStringList &oddNames()
         "digit 0.0",
         "\"quoted\"/back\\slash",
         "a,b;c/d",
+        "100%3/%1%2%4",
         "new\nline/ta\tb",
         "\x1b[31mred/call",
         "wei\u00df/\u4e2d",

@@ -23,7 +23,7 @@ std::vector<RuleFile> filesOf(const QList<QByteArray> &contents)
     for (const QByteArray &content : contents) {
         RuleFile file;
         Fault fault;
-        if (!file.take(QString("file%1.json").arg(files.size()), content, &fault)) {
+        if (!file.take("rules, %1 %2 of " + QString::number(files.size()), content, &fault)) {
             return {};
         }
         files.push_back(std::move(file));
