@@ -62,7 +62,8 @@ bool readInput(const QByteArray &path, QByteArray *content, Fault *fault)
     }
     content->clear();
     if (!readAll(&file, content)) {
-        return refuse("cannot be read: " + file.errorString(), QString(), fault);
+        return refuse("cannot be read: " + file.errorString(),
+                      "check where it comes from, or name another file.", fault);
     }
     if (content->size() > maximumInputSize) {
         return refuse(QString("longer than %1 MiB").arg(maximumInputSize / 1024 / 1024),
