@@ -6,6 +6,7 @@
 
 #include <QJsonArray>
 #include <QJsonDocument>
+#include <QRegularExpression>
 #include <QTextCodec>
 
 #include <algorithm>
@@ -202,14 +203,20 @@ bool isUtf8(const QByteArray &content)
 // stands in the place of the message already.
 QString withoutPlace(const QString &text)
 {
-    const int colon = text.startsWith('[') ? text.indexOf(": ") : -1;
-    return text.mid(colon < 0 ? 0 : colon + 2);
+    static const QRegularExpression place("^\\[json\\.[^]]*\\] (parse error at [^:]*: )?");
+    return QString(text).remove(place);
 }
 
 } // namespace
 
 bool readJson(const QByteArray &content, const TextIndex &index, JsonNode *root, Fault *fault)
 {
+    if (content.contains('\0') && isUtf8(content)) { // it would end the text for the reader below
+        fault->at = index.positionOf(content.indexOf('\0'));
+        fault->message = "not JSON: a byte of zero, as UTF-16 has them";
+        fault->remedy = "save the file in the encoding UTF-8.";
+        return false;
+    }
     const char *reached = content.constData();
     TreeBuilder builder(content, &reached);
     const Cursor begin(content.constData(), &reached);
