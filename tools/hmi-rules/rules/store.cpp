@@ -2,6 +2,7 @@
 
 #include <HmiStateMachine/named/viewstatetarget.h>
 
+#include <QDir>
 #include <QHash>
 #include <QLoggingCategory>
 #include <QTemporaryFile>
@@ -101,7 +102,10 @@ void load(Store *store, const QByteArray &content)
     QTemporaryFile file;
     if (!file.open() || file.write(content) != content.size() || !file.flush()) {
         throw std::runtime_error(
-            ("no temporary file can be written: " + file.errorString()).toStdString());
+            QString("no temporary file can be written in \"%1\" (%2); the variable TMPDIR of the "
+                    "environment names another folder")
+                .arg(QDir::tempPath(), file.errorString())
+                .toStdString());
     }
     store->loadInterruptionBehaviors(file.fileName());
 }
