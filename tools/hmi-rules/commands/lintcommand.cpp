@@ -68,7 +68,8 @@ private:
     Outcome outcome() const
     {
         Outcome result;
-        result.hasOutput = true;
+        // Other formats tell what could not be checked, too.
+        result.hasOutput = m_options.format != Format::Text || !m_report.files.isEmpty();
         result.exitCode = exitCode();
         for (const Fault &fault : m_report.unusable) {
             result.errors += toText(fault).toUtf8();
