@@ -70,6 +70,9 @@ rules_packages=(nlohmann-json3-dev libcli11-dev)
 # What its tests need beside that; groff and man check the man page, a browser the page of a matrix.
 rules_test_packages=(python3-jsonschema groff-base man-db chromium chromium-driver python3-selenium)
 
+# What feeding the tool with random input needs beside Clang, and so the preset "clang".
+fuzz_packages=(libclang-rt-14-dev)
+
 # The fonts of the head unit's screens.
 scene_packages=(fonts-inter fonts-material-design-icons-iconfont)
 

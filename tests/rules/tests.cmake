@@ -115,3 +115,9 @@ endforeach()
 target_sources(tst_rulesproperty PRIVATE
     rules/random/decisioncase.cpp
     rules/random/decisioncase.h)
+
+if(HMISTATEMACHINE_BUILD_FUZZERS)
+    add_subdirectory(rules/fuzz)
+else()
+    message(STATUS "Random input for hmi-rules: off (HMISTATEMACHINE_BUILD_FUZZERS)")
+endif()
