@@ -97,14 +97,21 @@ private:
 
 QStringList Listener::s_messages;
 
+// Of a folder that is not there QTemporaryFile makes the root folder.
+QString temporaryFolder()
+{
+    const QString named = qEnvironmentVariable("TMPDIR");
+    return named.isEmpty() ? QDir::tempPath() : named;
+}
+
 void load(Store *store, const QByteArray &content)
 {
-    QTemporaryFile file;
+    QTemporaryFile file(temporaryFolder() + "/hmi-rules-XXXXXX");
     if (!file.open() || file.write(content) != content.size() || !file.flush()) {
         throw std::runtime_error(
             QString("no temporary file can be written in \"%1\" (%2); the variable TMPDIR of the "
                     "environment names another folder")
-                .arg(QDir::tempPath(), file.errorString())
+                .arg(temporaryFolder(), file.errorString())
                 .toStdString());
     }
     store->loadInterruptionBehaviors(file.fileName());
