@@ -28,6 +28,7 @@ private:
     bool readMember(const JsonMember &member);
     bool readPopups(const JsonNode &list);
     bool readPopup(const JsonNode &node);
+    bool hasKnownKeys(const JsonNode &popup);
     bool readNames(const JsonNode &list, QStringList *names);
     bool refuse(int offset, const QString &message, const QString &remedy);
     bool expect(const JsonNode &node, JsonNode::Type type);
@@ -107,16 +108,25 @@ bool InventoryReader::readPopups(const JsonNode &list)
     return true;
 }
 
+bool InventoryReader::hasKnownKeys(const JsonNode &popup)
+{
+    for (const JsonMember &member : popup.members) {
+        if (member.key != "name" && member.key != "viewId") {
+            return refuse(member.begin,
+                          "unknown key \"" + member.key + "\" of a popup in the inventory",
+                          R"(it may have "name" and "viewId".)");
+        }
+    }
+    return true;
+}
+
 bool InventoryReader::readPopup(const JsonNode &node)
 {
-    if (node.type == JsonNode::String) {
-        addPopup(node.text, node.text, node.begin);
-        return true;
-    }
-    if (!expect(node, JsonNode::Object)) {
+    const bool isName = node.type == JsonNode::String;
+    if (!isName && !(expect(node, JsonNode::Object) && hasKnownKeys(node))) {
         return false;
     }
-    const QString name = node.string("name");
+    const QString name = isName ? node.text : node.string("name");
     const QString viewId = node.value("viewId") ? node.string("viewId") : name;
     if (name.isEmpty() || viewId.isEmpty()) {
         return refuse(node.begin,
