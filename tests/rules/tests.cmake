@@ -96,6 +96,11 @@ add_test(NAME rules-page COMMAND ${HMI_TEST_PYTHON} -B
     --chromedriver ${HMI_TEST_CHROMEDRIVER}
     --parts ${PROJECT_SOURCE_DIR}/tools/hmi-rules/matrix/page)
 set_tests_properties(rules-page PROPERTIES LABELS rules TIMEOUT 120)
+
+# For files with repeated keys or faults, in which Qt leaks.
+set(HMI_QT_JSON_LEAKS
+    LSAN_OPTIONS=suppressions=${CMAKE_CURRENT_SOURCE_DIR}/rules/qtjson.supp:print_suppressions=0)
+
 # Files of rules made at random, and what must hold for any of them.
 foreach(name IN ITEMS rulesproperty rulespropertydiff rulespropertyreports)
     hmi_add_test(rules ${name})
@@ -109,7 +114,8 @@ foreach(name IN ITEMS rulesproperty rulespropertydiff rulespropertyreports)
     target_link_libraries(tst_${name} PRIVATE hmi_rules_parts)
     set_tests_properties(${name} PROPERTIES TIMEOUT 120)
     if(HMISTATEMACHINE_SANITIZE)
-        set_tests_properties(${name} PROPERTIES ENVIRONMENT HMI_RANDOM_STEPS=10)
+        set_tests_properties(${name} PROPERTIES
+            ENVIRONMENT "HMI_RANDOM_STEPS=10;${HMI_QT_JSON_LEAKS}")
     endif()
 endforeach()
 target_sources(tst_rulesproperty PRIVATE
@@ -121,3 +127,17 @@ if(HMISTATEMACHINE_BUILD_FUZZERS)
 else()
     message(STATUS "Random input for hmi-rules: off (HMISTATEMACHINE_BUILD_FUZZERS)")
 endif()
+
+# The whole program with files, streams and environments that something is wrong with.
+foreach(name IN ITEMS rulesbadinput rulesbadsurroundings)
+    hmi_add_test(rules ${name})
+    target_sources(tst_${name} PRIVATE
+        rules/badinput/program.cpp
+        rules/badinput/program.h)
+    target_include_directories(tst_${name} PRIVATE rules)
+    target_compile_definitions(tst_${name} PRIVATE
+        HMI_RULES_PROGRAM="$<TARGET_FILE:hmi-rules>"
+        HMI_TEST_DATA_DIR="${CMAKE_CURRENT_SOURCE_DIR}/rules/badinput")
+    add_dependencies(tst_${name} hmi-rules)
+    set_tests_properties(${name} PROPERTIES TIMEOUT 120 ENVIRONMENT "${HMI_QT_JSON_LEAKS}")
+endforeach()
