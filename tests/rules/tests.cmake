@@ -67,6 +67,10 @@ set_tests_properties(rules-page-made PROPERTIES FIXTURES_REQUIRED rules_page)
 set_tests_properties(rules-page rules-page-make rules-page-made PROPERTIES
     LABELS rules TIMEOUT 120)
 
+# For files with repeated keys or faults, in which Qt leaks.
+set(HMI_QT_JSON_LEAKS
+    LSAN_OPTIONS=suppressions=${CMAKE_CURRENT_SOURCE_DIR}/rules/qtjson.supp:print_suppressions=0)
+
 # hmi-rules run in the test's own process, compared with the files that are listed in a folder.
 add_library(hmi_rules_goldens STATIC rules/goldens.cpp rules/goldens.h)
 hmi_target_defaults(hmi_rules_goldens)
@@ -80,26 +84,11 @@ foreach(name IN ITEMS lintcases lintcompleteness sarif toolcases)
     hmi_add_test(rules ${name})
     target_link_libraries(tst_${name} PRIVATE hmi_rules_goldens)
     target_compile_definitions(tst_${name} PRIVATE HMI_TEST_DATA_DIR="${HMI_DATA_OF_${name}}")
+    set_tests_properties(${name} PROPERTIES ENVIRONMENT "${HMI_QT_JSON_LEAKS}")
 endforeach()
 target_compile_definitions(tst_toolcases PRIVATE
     HMI_POPUP_RULES_PAGE="${PROJECT_SOURCE_DIR}/docs/popup-rules.md"
     HMI_RULES_SCHEMA="${PROJECT_SOURCE_DIR}/tools/hmi-rules/schema/popup-interruptions.schema.json")
-
-execute_process(COMMAND ${HMI_TEST_PYTHON} -c "import selenium"
-    RESULT_VARIABLE without_selenium OUTPUT_QUIET ERROR_QUIET)
-if(without_selenium)
-    message(FATAL_ERROR "${HMI_TEST_PYTHON} has no module selenium for the test of the page")
-endif()
-add_test(NAME rules-page COMMAND ${HMI_TEST_PYTHON} -B
-    ${CMAKE_CURRENT_LIST_DIR}/page/page_test.py
-    --chromium ${HMI_TEST_CHROMIUM}
-    --chromedriver ${HMI_TEST_CHROMEDRIVER}
-    --parts ${PROJECT_SOURCE_DIR}/tools/hmi-rules/matrix/page)
-set_tests_properties(rules-page PROPERTIES LABELS rules TIMEOUT 120)
-
-# For files with repeated keys or faults, in which Qt leaks.
-set(HMI_QT_JSON_LEAKS
-    LSAN_OPTIONS=suppressions=${CMAKE_CURRENT_SOURCE_DIR}/rules/qtjson.supp:print_suppressions=0)
 
 # Files of rules made at random, and what must hold for any of them.
 foreach(name IN ITEMS rulesproperty rulespropertydiff rulespropertyreports)
