@@ -57,6 +57,6 @@ run(0 man --warnings -l ${prefix}/share/man/man1/hmi-rules.1)
 expect("hmi-rules")
 run(0 bash -n ${prefix}/share/bash-completion/completions/hmi-rules)
 
-run(0 ${CMAKE_COMMAND} -S ${example} -B ${WORK_DIR}/consumer
+run(0 ${CMAKE_COMMAND} -G Ninja -S ${example} -B ${WORK_DIR}/consumer
     -DCMAKE_PREFIX_PATH=${prefix} -DVERSION=${VERSION})
 run(0 ${CMAKE_COMMAND} --build ${WORK_DIR}/consumer)
