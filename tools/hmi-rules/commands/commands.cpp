@@ -23,53 +23,66 @@ Outcome refused(const Fault &fault)
     return {exitUnusable, QByteArray(), toText(fault).toUtf8(), false};
 }
 
+/** What explain and matrix answer from. */
+struct Inputs
+{
+    std::unique_ptr<RuleBase> base;
+    Inventory inventory;
+};
+
+bool readInputs(const Options &options, Inputs *inputs, Fault *fault)
+{
+    inputs->base = loadRules(options.base + options.files, fault);
+    return inputs->base && readInventory(options, &inputs->inventory, fault);
+}
+
 } // namespace
 
 Outcome runExplain(const Options &options)
 {
     Fault fault;
-    Inventory inventory;
-    const auto base = loadRules(options.base + options.files, &fault);
-    if (!base || !readInventory(options, &inventory, &fault)) {
+    Inputs inputs;
+    if (!readInputs(options, &inputs, &fault)) {
         return refused(fault);
     }
-    const Explanation explanation = explain(*base, inventory, options.front, options.requested);
-    const QString viewId = inventory.viewIdOf(options.requested);
+    const RuleBase &base = *inputs.base;
+    const Explanation explanation =
+        explain(base, inputs.inventory, options.front, options.requested);
+    const QString viewId = inputs.inventory.viewIdOf(options.requested);
     std::vector<BlockingExplanation> blocking;
     for (const QString &domain : options.domains) {
-        blocking.push_back(explainBlocking(*base, viewId, domain, Site::DomainBlacklist));
+        blocking.push_back(explainBlocking(base, viewId, domain, Site::DomainBlacklist));
     }
     for (const QString &view : options.views) {
-        blocking.push_back(explainBlocking(*base, viewId, view, Site::ViewBlacklist));
+        blocking.push_back(explainBlocking(base, viewId, view, Site::ViewBlacklist));
     }
     if (options.format == Format::Json) {
-        return written(explanationAsJson(*base, explanation, blocking));
+        return written(explanationAsJson(base, explanation, blocking));
     }
     const Paint paint(isColored(options));
-    return written(explanationAsText(*base, explanation, blocking, paint));
+    return written(explanationAsText(base, explanation, blocking, paint));
 }
 
 Outcome runMatrix(const Options &options)
 {
     Fault fault;
-    Inventory inventory;
-    const auto base = loadRules(options.base + options.files, &fault);
-    if (!base || !readInventory(options, &inventory, &fault)) {
+    Inputs inputs;
+    if (!readInputs(options, &inputs, &fault)) {
         return refused(fault);
     }
-    const auto population = restrictedTo(options.only, populationOf(*base, inventory));
-    if (!isListable(population, &fault)) {
+    const RuleBase &base = *inputs.base;
+    auto population = populationOf(base, inputs.inventory);
+    if (!restrictTo(options.only, &population, &fault) || !isListable(population, &fault)) {
         return refused(fault);
     }
-    const Matrix matrix = makeMatrix(*base, population);
+    const Matrix matrix = makeMatrix(base, population);
     if (options.format == Format::Html) {
-        return written(matrixAsHtml(*base, matrix));
+        return written(matrixAsHtml(base, matrix));
     }
     if (options.format == Format::Csv) {
-        return written(options.blocking ? blockingAsCsv(*base, matrix)
-                                        : matrixAsCsv(*base, matrix));
+        return written(options.blocking ? blockingAsCsv(base, matrix) : matrixAsCsv(base, matrix));
     }
-    return written(matrixAsText(*base, matrix, Paint(isColored(options))));
+    return written(matrixAsText(base, matrix, Paint(isColored(options))));
 }
 
 Outcome runDiff(const Options &options)

@@ -3,9 +3,28 @@
 #include "libraryfacts.h"
 #include "names.h"
 
-#include <algorithm>
+#include "lint/guess.h"
+#include "report/visible.h"
+
+#include <QSet>
 
 namespace hmirules {
+
+namespace {
+
+// Under which of the patterns somebody is.
+QStringList wantedKeys(const QStringList &patterns, const Individual &individual)
+{
+    QStringList wanted;
+    for (const QString &key : keysOf(individual.name)) {
+        if (patterns.contains(key)) {
+            wanted.append(key);
+        }
+    }
+    return wanted;
+}
+
+} // namespace
 
 QList<Individual> populationOf(const RuleBase &base, const Inventory &inventory)
 {
@@ -25,17 +44,33 @@ QList<Individual> populationOf(const RuleBase &base, const Inventory &inventory)
     return population;
 }
 
-QList<Individual> restrictedTo(const QStringList &patterns, const QList<Individual> &population)
+bool restrictTo(const QStringList &patterns, QList<Individual> *population, Fault *fault)
 {
+    if (patterns.isEmpty()) {
+        return true;
+    }
+    QStringList names;
+    QSet<QString> used;
     QList<Individual> restricted;
-    for (const Individual &individual : population) {
-        const QStringList keys = keysOf(individual.name);
-        if (std::any_of(patterns.cbegin(), patterns.cend(),
-                        [&keys](const QString &pattern) { return keys.contains(pattern); })) {
+    for (const Individual &individual : *population) {
+        names.append(individual.name);
+        const QStringList wanted = wantedKeys(patterns, individual);
+        if (!wanted.isEmpty()) {
             restricted.append(individual);
+            used += QSet<QString>(wanted.cbegin(), wanted.cend());
         }
     }
-    return patterns.isEmpty() ? population : restricted;
+    for (const QString &pattern : patterns) {
+        if (!used.contains(pattern)) {
+            *fault = Fault();
+            fault->message = QString("no popup is under \"%1\"").arg(visible(pattern))
+                + didYouMean(pattern, names);
+            fault->remedy = "name a popup that is in the file or the inventory, or a wildcard.";
+            return false;
+        }
+    }
+    *population = restricted;
+    return true;
 }
 
 bool isListable(const QList<Individual> &population, Fault *fault)

@@ -28,8 +28,11 @@ constexpr int maximumPopulation = 3000;
  */
 QList<Individual> populationOf(const RuleBase &base, const Inventory &inventory);
 
-/** Those that are, or are under, one of these names or wildcards. */
-QList<Individual> restrictedTo(const QStringList &patterns, const QList<Individual> &population);
+/**
+ * Leaves those that are, or are under, one of these names or wildcards; all when there are none.
+ * False with a fault when one of them leaves nobody.
+ */
+bool restrictTo(const QStringList &patterns, QList<Individual> *population, Fault *fault);
 
 /** False with a fault when there are too many. */
 bool isListable(const QList<Individual> &population, Fault *fault);
