@@ -6,8 +6,10 @@
 #include "explain/explanationtext.h"
 #include "input/inventory.h"
 #include "lint/findinglist.h"
+#include "lint/guess.h"
 #include "matrix/matrixtext.h"
 #include "report/resource.h"
+#include "report/visible.h"
 
 namespace hmirules {
 
@@ -36,6 +38,19 @@ bool readInputs(const Options &options, Inputs *inputs, Fault *fault)
     return inputs->base && readInventory(options, &inputs->inventory, fault);
 }
 
+// A mistyped name is explained like any other, which is worth a word.
+QByteArray noteUnlisted(const Inventory &inventory, const QStringList &popups)
+{
+    QString notes;
+    for (const QString &popup : popups) {
+        if (inventory.hasPopups && !inventory.popupNames().contains(popup)) {
+            notes += QString("hmi-rules: note: no popup \"%1\" is in the inventory%2\n")
+                         .arg(visible(popup), didYouMean(popup, inventory.popupNames()));
+        }
+    }
+    return notes.toUtf8();
+}
+
 } // namespace
 
 Outcome runExplain(const Options &options)
@@ -56,11 +71,12 @@ Outcome runExplain(const Options &options)
     for (const QString &view : options.views) {
         blocking.push_back(explainBlocking(base, viewId, view, Site::ViewBlacklist));
     }
-    if (options.format == Format::Json) {
-        return written(explanationAsJson(base, explanation, blocking));
-    }
     const Paint paint(isColored(options));
-    return written(explanationAsText(base, explanation, blocking, paint));
+    Outcome outcome = written(options.format == Format::Json
+                                  ? explanationAsJson(base, explanation, blocking)
+                                  : explanationAsText(base, explanation, blocking, paint));
+    outcome.errors = noteUnlisted(inputs.inventory, {options.front, options.requested});
+    return outcome;
 }
 
 Outcome runMatrix(const Options &options)
