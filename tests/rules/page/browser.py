@@ -8,10 +8,7 @@ from pathlib import Path
 from selenium import webdriver
 from selenium.webdriver import ActionChains, Keys
 from selenium.webdriver.chrome.service import Service
-from selenium.webdriver.common import utils
 from selenium.webdriver.common.by import By
-
-LOOPBACK = "127.0.0.1"
 
 FLAGS = (
     "--headless", "--no-sandbox", "--disable-gpu", "--disable-quic", "--no-first-run",
@@ -53,21 +50,6 @@ async function search(selector, name, side, extent, view) {
 """
 
 
-class LoopbackService(Service):
-    """Chromedriver by its address: there may be a proxy, and no name localhost."""
-
-    @property
-    def service_url(self):
-        return f"http://{LOOPBACK}:{self.port}"
-
-    def is_connectable(self):
-        return utils.is_connectable(self.port, LOOPBACK)
-
-    def start(self):
-        os.environ["no_proxy"] = os.environ["NO_PROXY"] = LOOPBACK
-        super().start()
-
-
 class Browser:
     """Ends chromedriver and Chromium, and removes their files, when its block is left."""
 
@@ -78,8 +60,10 @@ class Browser:
         for flag in (*FLAGS, f"--user-data-dir={self.folder.name}/profile"):
             options.add_argument(flag)
         options.set_capability("goog:loggingPrefs", {"browser": "ALL", "performance": "ALL"})
+        # What goes to this machine is not for a proxy.
+        os.environ["no_proxy"] = os.environ["NO_PROXY"] = "localhost,127.0.0.1"
         try:
-            self.driver = webdriver.Chrome(service=LoopbackService(chromedriver), options=options)
+            self.driver = webdriver.Chrome(service=Service(chromedriver), options=options)
         except BaseException:
             self.folder.cleanup()
             raise
