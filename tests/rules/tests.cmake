@@ -121,6 +121,7 @@ endif()
 foreach(name IN ITEMS rulesbadinput rulesbadsurroundings)
     hmi_add_test(rules ${name})
     target_sources(tst_${name} PRIVATE
+        rules/badinput/files.h
         rules/badinput/program.cpp
         rules/badinput/program.h)
     target_include_directories(tst_${name} PRIVATE rules)

@@ -1,3 +1,4 @@
+#include "badinput/files.h"
 #include "badinput/program.h"
 
 #include <QTemporaryDir>
@@ -7,23 +8,9 @@
 
 namespace {
 
-constexpr char remark[] = R"([{"popup": "phone/call", "default": "Nein"}])";
-constexpr char fine[] = R"([{"popup": "phone/call", "default": "Allow"}])";
-
-bool write(const QString &path, const QByteArray &content)
-{
-    QFile file(path);
-    return file.open(QIODevice::WriteOnly) && file.write(content) == content.size();
-}
-
 QByteArray nested(int levels)
 {
     return QByteArray(levels, '[') + QByteArray(levels, ']');
-}
-
-QByteArray first(const QByteArray &text)
-{
-    return text.left(text.indexOf('\n'));
 }
 
 } // namespace

@@ -1,3 +1,4 @@
+#include "badinput/files.h"
 #include "badinput/program.h"
 
 #include <QTemporaryDir>
@@ -7,24 +8,10 @@
 
 namespace {
 
-constexpr char remark[] = R"([{"popup": "phone/call", "default": "Nein"}])";
-constexpr char fine[] = R"([{"popup": "phone/call", "default": "Allow"}])";
-
-bool write(const QString &path, const QByteArray &content)
-{
-    QFile file(path);
-    return file.open(QIODevice::WriteOnly) && file.write(content) == content.size();
-}
-
 QByteArray readBack(const QString &path)
 {
     QFile file(path);
     return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray("unreadable");
-}
-
-QByteArray first(const QByteArray &text)
-{
-    return text.left(text.indexOf('\n'));
 }
 
 } // namespace
