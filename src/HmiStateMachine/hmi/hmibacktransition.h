@@ -17,11 +17,15 @@ class HMISTATEMACHINE_EXPORT HmiBackTransition : public QAbstractTransition,
     Q_OBJECT
 
 public:
+    /** Hangs on @p source itself, also when that has layers. */
     explicit HmiBackTransition(QState *source = nullptr);
     ~HmiBackTransition() override;
 
 protected:
+    /** Accepts any HmiBackEvent. */
     bool eventTest(QEvent *event) override;
+
+    /** Takes the transition off the list of firing ones. */
     void onTransition(QEvent *event) override;
 
 public:

@@ -20,14 +20,20 @@ class HMISTATEMACHINE_EXPORT HmiConditionalState : public HmiState
     Q_OBJECT
 
 public:
+    /** A decision inside @p parent, or in its exclusive layer when it has layers. */
     HmiConditionalState(const QString &name, HmiState *parent);
+
+    /** The same with any state as the parent, or with none. */
     explicit HmiConditionalState(const QString &name, QState *parent = nullptr);
     ~HmiConditionalState() override;
 
+    /** Where it passes on to; null leaves no target. Not owned. */
     void setTargetState(QAbstractState *target);
 
     /** The name is looked up now; when it is empty or unknown there is no target. */
     void setNamedTargetState(const Identifier &name);
+
+    /** Empty without a target, or when that is no NamedState. */
     QString targetStateName() const;
 
 Q_SIGNALS:

@@ -22,7 +22,9 @@ class HMISTATEMACHINE_EXPORT HmiDelayedSignalTransition : public HmiSignalTransi
 
 public:
     /**
-     * @p signal is written with SIGNAL(). @p delay is in milliseconds; a negative one counts as 0.
+     * @p signal is written with SIGNAL(), and @p sender is not owned; what Qt calls the sender and
+     * the signal of the transition is itself and internalTrigger(). @p delay is in milliseconds; a
+     * negative one counts as 0.
      */
     HmiDelayedSignalTransition(QObject *sender, const char *signal, int delay,
                                QState *sourceState = nullptr);

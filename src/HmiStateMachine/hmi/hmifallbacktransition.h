@@ -17,11 +17,18 @@ class HMISTATEMACHINE_EXPORT HmiFallbackTransition : public QAbstractTransition,
     Q_OBJECT
 
 public:
+    /** Hangs on @p source itself, also when that has layers. */
     explicit HmiFallbackTransition(QState *source = nullptr);
     ~HmiFallbackTransition() override;
 
 protected:
+    /**
+     * Accepts any HmiFallbackEvent; one that names a state makes it the target, or leaves none when
+     * the name is unknown.
+     */
     bool eventTest(QEvent *event) override;
+
+    /** Takes the transition off the list of firing ones. */
     void onTransition(QEvent *event) override;
 
 public:

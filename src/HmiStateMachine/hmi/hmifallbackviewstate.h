@@ -21,6 +21,8 @@ public:
     /** @p fallbackState is looked up by name now; make it first. */
     HmiFallbackViewState(const QString &name, const QString &fallbackState,
                          QState *parent = nullptr);
+
+    /** With a target view that is not called like the state. */
     HmiFallbackViewState(const QString &targetView, const QString &name,
                          const QString &fallbackState, QState *parent = nullptr);
     ~HmiFallbackViewState() override;
@@ -33,6 +35,7 @@ public Q_SLOTS:
     void reevaluate();
 
 protected:
+    /** Asks permitted(): hands the view to the view layer, or posts the fallback event. */
     void onActivated() override;
 
 public:

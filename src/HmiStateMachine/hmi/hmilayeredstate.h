@@ -13,16 +13,23 @@ class PopupRootState;
  * States that are made with it as their parent land in the exclusive layer, of which exactly one is
  * active; the initial one is set by setInitialHmiState(). Popups are made with it, too, and
  * requested by PopupEvents.
+ *
+ * It makes and owns both layers, which are entered and left with it. Leaving it hides its popups,
+ * and none of them returns.
  */
 class HMISTATEMACHINE_EXPORT HmiLayeredState : public HmiState
 {
     Q_OBJECT
 
 public:
+    /** The root of the popup layer is named @p name followed by "_PopupRootState". */
     explicit HmiLayeredState(const QString &name, QState *parent = nullptr);
     ~HmiLayeredState() override;
 
+    /** The parent of the screens. It carries the name "Exclusive" without being registered. */
     HmiState *exclusiveState() const;
+
+    /** The root of the popup layer. */
     PopupRootState *popupState() const;
 
     /** Warns and forwards to setInitialHmiState(). */
@@ -33,6 +40,8 @@ public:
 
     /** The initial state of the exclusive layer. A popup is refused with a warning. */
     void setInitialHmiState(QState *state) override;
+
+    /** The initial state of the exclusive layer; null when there is none. */
     QAbstractState *initialHmiState() const override;
 
 private:

@@ -11,6 +11,7 @@ namespace HmiStateMachine {
 class HMISTATEMACHINE_EXPORT HmiModuleBlacklistFilter : public HmiTargetFilter
 {
 public:
+    /** @p module is what names of the module begin with; every name begins with an empty one. */
     explicit HmiModuleBlacklistFilter(const QString &module);
     ~HmiModuleBlacklistFilter() override;
 

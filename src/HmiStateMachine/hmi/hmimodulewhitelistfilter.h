@@ -11,6 +11,7 @@ namespace HmiStateMachine {
 class HMISTATEMACHINE_EXPORT HmiModuleWhitelistFilter : public HmiTargetFilter
 {
 public:
+    /** @p module is what names of the module begin with; every name begins with an empty one. */
     explicit HmiModuleWhitelistFilter(const QString &module);
     ~HmiModuleWhitelistFilter() override;
 

@@ -28,12 +28,15 @@ public:
                                       QObject *object, const char *property,
                                       QList<QVariant> permittedValues, QState *parent,
                                       bool autoReevaluate);
+
+    /** With a target view that is not called like the state. */
     HmiPropertyBoundFallbackViewState(const QString &targetView, const QString &name,
                                       const QString &fallbackState, QObject *object,
                                       const char *property, QList<QVariant> permittedValues,
                                       QState *parent, bool autoReevaluate);
     ~HmiPropertyBoundFallbackViewState() override;
 
+    /** Whether the property has one of the permitted values; true without an object. */
     bool permitted() override;
 
 private:

@@ -22,17 +22,23 @@ class HMISTATEMACHINE_EXPORT HmiSignalTransition : public QSignalTransition,
     Q_OBJECT
 
 public:
+    /** A transition without a sender, which fires once it has been given one. */
     explicit HmiSignalTransition(QState *sourceState = nullptr);
 
-    /** @p signal is written with SIGNAL(). */
+    /**
+     * @p signal is written with SIGNAL(). @p sender is not owned. Hangs on @p sourceState, and on
+     * the exclusive layer of one that has layers.
+     */
     HmiSignalTransition(const QObject *sender, const char *signal, QState *sourceState = nullptr);
     ~HmiSignalTransition() override;
 
     /**
      * A blocked transition never fires. It still counts in its sibling groups, where it takes the
-     * event from those of lower priority.
+     * event from those of lower priority. Off at first.
      */
     bool blocked() const;
+
+    /** Counts from the next event on. */
     void setBlocked(bool blocked);
 
     /**
@@ -42,7 +48,12 @@ public:
     bool makeParallelExclusive(int priority);
 
 protected:
+    /**
+     * Accepts what internalEventTest() accepts, unless it is blocked or a sibling takes the event.
+     */
     bool eventTest(QEvent *event) override;
+
+    /** Takes the transition off the list of firing ones and passes a voice request on. */
     void onTransition(QEvent *event) override;
 
 public:
@@ -51,13 +62,18 @@ public:
     QAbstractState *getTarget() const override;
 
     // In place, because every transition of an active state is asked three times for every event.
+    /** Sender and signal, as QSignalTransition compares them. */
     bool internalEventTest(QEvent *event) override { return QSignalTransition::eventTest(event); }
 
     /** HmiState::addHmiTransition() has made @p state the source; does nothing here. */
     virtual void sourceStateChange(QState *state);
 
 Q_SIGNALS:
-    /** Follows each firing, before the target is entered. */
+    /**
+     * Follows each firing, before the target is entered and before any other receiver of
+     * triggered() is called. The arguments are those of the signal, in its order; none for a signal
+     * without.
+     */
     void triggeredWithArguments(QVariantList triggerArguments);
 
 private:
@@ -77,8 +93,10 @@ private:
 class HMISTATEMACHINE_EXPORT TriggerFunctor
 {
 public:
+    /** @p transition is not owned. */
     explicit TriggerFunctor(HmiSignalTransition *transition);
 
+    /** Emits the arguments with which the transition was fired last. */
     void operator()() const;
 
 private:

@@ -37,9 +37,13 @@ public:
      */
     static HmiState *createWithoutHashing(const QString &name, QState *parent);
 
+    /** What an entry tells the view layer; DefaultPopupBehavior unless inherited or set. */
     PopupBehavior popupBehavior() const;
 
-    /** Adds @p t, and lets a signal transition know its new source. */
+    /**
+     * Adds @p t, as NamedState::addTransition() does, and lets a signal transition know its new
+     * source.
+     */
     void addHmiTransition(QAbstractTransition *t);
 
 public Q_SLOTS:
@@ -57,12 +61,19 @@ Q_SIGNALS:
     void popupBehaviorChanged(PopupBehavior arg);
 
 protected:
+    /**
+     * Writes the marker, does what NamedState does, and tells the view layer the popup behaviour.
+     */
     void onEntry(QEvent *event) override;
+
+    /** As NamedState does. */
     void onExit(QEvent *event) override;
 
 public:
     /** The initial state, for states that run more than one layer. */
     virtual void setInitialHmiState(QState *state);
+
+    /** Null when there is none. */
     virtual QAbstractState *initialHmiState() const;
 
 private:

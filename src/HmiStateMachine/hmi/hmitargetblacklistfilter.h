@@ -11,6 +11,7 @@ namespace HmiStateMachine {
 class HMISTATEMACHINE_EXPORT HmiTargetBlacklistFilter : public HmiTargetFilter
 {
 public:
+    /** @p target is the name that is refused. */
     explicit HmiTargetBlacklistFilter(const QString &target);
     ~HmiTargetBlacklistFilter() override;
 

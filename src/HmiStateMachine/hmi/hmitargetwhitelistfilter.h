@@ -11,6 +11,7 @@ namespace HmiStateMachine {
 class HMISTATEMACHINE_EXPORT HmiTargetWhitelistFilter : public HmiTargetFilter
 {
 public:
+    /** @p target is the name that is accepted. */
     explicit HmiTargetWhitelistFilter(const QString &target);
     ~HmiTargetWhitelistFilter() override;
 

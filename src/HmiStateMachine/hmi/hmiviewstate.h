@@ -48,6 +48,8 @@ class HMISTATEMACHINE_EXPORT HmiViewState : public HmiState
 public:
     /** The target view is @p name. */
     explicit HmiViewState(const QString &name, QState *parent = nullptr);
+
+    /** An empty @p targetView makes a dummy. */
     HmiViewState(const QString &targetView, const QString &name, QState *parent = nullptr);
     ~HmiViewState() override;
 
@@ -65,6 +67,11 @@ public:
 
     /** The back-stack state id of the view that was left forwards last; empty at first. */
     static QString lastKnownViewState();
+
+    /**
+     * Replaces it, until a view that has back stack presence is left forwards. Needs no state of
+     * that name.
+     */
     static void setLastKnownViewState(const QString &id);
 
     /** The view state named @p target, or else the first that shows it; null when there is none. */
@@ -75,6 +82,8 @@ public:
      * direct back transition, with which the back stack goes.
      */
     void setHandlesBackEvent(bool on);
+
+    /** Off at first, and with a direct back transition. */
     bool handlesBackEvent() const;
 
     /**
@@ -82,9 +91,14 @@ public:
      * null @p target there is none any more. directBackTransitionTargetChanged() is emitted always.
      */
     void createDirectBackTransition(QAbstractState *target);
+
+    /** Null without a direct back transition. */
     QAbstractState *directBackTransitionTarget() const;
 
-    /** The name of the state that a back press leads to; empty while there is none. */
+    /**
+     * The name of the state that a back press leads to while handlesBackEvent() is on; empty while
+     * there is none, and always with a direct back transition.
+     */
     QString backTarget() const;
 
     /**
@@ -94,6 +108,8 @@ public:
      * known view keeps its back target, unless @p backTargetAcrossSameId.
      */
     void setBackStackStateId(const QString &id, bool backTargetAcrossSameId);
+
+    /** The name of the state unless it was set. */
     QString backStackStateId() const;
 
     /** While the back target of @p state is not empty it is taken for this view too. Not owned. */
@@ -117,10 +133,14 @@ public:
 
     /** Without presence the view is never the last known view. On at first. */
     void setHasBackStackPresence(bool on);
+
+    /** On at first. */
     bool hasBackStackPresence() const;
 
     /** While blocked, the view takes no requests for other views. */
     void setIndirectViewTransitionsBlocked(bool blocked);
+
+    /** Off at first. */
     bool indirectViewTransitionsBlocked() const;
 
     /** Empty for a dummy. */
@@ -135,19 +155,38 @@ public:
     /** Takes the top off the back stack, empty when it has none; emits backStackPop() always. */
     QString popBackStack();
 
+    /**
+     * Adds to the map that the view layer is given, from the next entry or exit on. The three keys
+     * of the library's own are overwritten then.
+     */
     void addInstanceData(const QString &key, const QVariant &value);
+
+    /** A key that is not there is ignored. */
     void removeInstanceData(const QString &key);
 
+    /** What setActivationData() was given last; invalid at first. */
     QVariant activationData() const;
 
     /** Lets the view follow the view layer's reports; see viewActivated(). Off at first. */
     void setReportsQmlViewStatus(bool on);
+
+    /** Off at first. */
     bool reportsQmlViewStatus() const;
 
 Q_SIGNALS:
+    /** Emitted by each popBackStack(), also when there was nothing to take. */
     void backStackPop();
+
+    /** @p id is on top of the back stack now. */
     void backStackPush(Identifier id);
+
+    /**
+     * Emitted by setHandlesBackEvent() on a real change; not by createDirectBackTransition(),
+     * although that ends back handling.
+     */
     void handlesBackEventChanged(bool handlesBackEvent);
+
+    /** Emitted by each createDirectBackTransition(); null when there is none any more. */
     void directBackTransitionTargetChanged(QAbstractState *backTarget);
 
     /** The view layer has reported that it shows this view; needs setReportsQmlViewStatus(). */
@@ -155,8 +194,16 @@ Q_SIGNALS:
 
     /** The view layer shows another view although this one is active; its reports are left then. */
     void viewDeactivated();
+
+    /**
+     * The view layer has reported that this view begins to move; needs setReportsQmlViewStatus().
+     */
     void viewAnimationStarted(int type);
+
+    /** Only on a real change, after the value is stored. */
     void activationDataChanged(QVariant data);
+
+    /** The time that createDummyViewState() was given has run out. */
     void dummyViewStateTimeout();
 
     /** This view was requested while it was active. */
@@ -173,10 +220,14 @@ private Q_SLOTS:
     void backToLastKnownView();
 
 protected:
+    /** Finds the back target, stores the instance data and ends with onActivated(). */
     void onEntry(QEvent *event) override;
+
+    /** Remembers the view and its back target, and tells the view layer that it is left. */
     void onExit(QEvent *event) override;
 
 public:
+    /** Remembers whether the state named by backStackStateId() was entered by a back press. */
     void monitoredStateEntered(QEvent *event) override;
 
 protected:

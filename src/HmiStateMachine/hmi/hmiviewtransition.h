@@ -20,15 +20,21 @@ class HMISTATEMACHINE_EXPORT HmiViewTransition : public QAbstractTransition,
     Q_OBJECT
 
 public:
+    /** Hangs on @p source itself, also when that has layers. */
     explicit HmiViewTransition(QState *source = nullptr);
     ~HmiViewTransition() override;
 
     /** A blocked transition takes no request. */
     void setBlocked(bool blocked);
+
+    /** Off at first. */
     bool blocked() const;
 
 protected:
+    /** Looks the requested view up and makes its state the target. */
     bool eventTest(QEvent *event) override;
+
+    /** Takes the transition off the list of firing ones. */
     void onTransition(QEvent *event) override;
 
 public:

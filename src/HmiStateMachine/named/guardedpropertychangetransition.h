@@ -34,6 +34,7 @@ public:
     /** Whether @p value will do as the new value. */
     bool valueTest(const QVariant &value) const;
 
+    /** Signal and guard first, then the previous value, then the new one. */
     bool internalEventTest(QEvent *event) override;
 
 private Q_SLOTS:

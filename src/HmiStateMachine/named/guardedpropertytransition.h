@@ -19,6 +19,7 @@ class HMISTATEMACHINE_EXPORT GuardedPropertyTransition : public GuardedSignalTra
     Q_OBJECT
 
 public:
+    /** A transition without a sender, which fires once it has been given one. */
     explicit GuardedPropertyTransition(QState *sourceState = nullptr);
 
     /** Never fires when extractNotifySignal() finds nothing to listen to. */
@@ -27,6 +28,7 @@ public:
     ~GuardedPropertyTransition() override;
 
 protected:
+    /** As HmiSignalTransition does. */
     bool eventTest(QEvent *event) override;
 
 private:

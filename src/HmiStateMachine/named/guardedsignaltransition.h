@@ -21,21 +21,33 @@ class HMISTATEMACHINE_EXPORT GuardedSignalTransition : public HmiSignalTransitio
                    setAllowTransitionDefault NOTIFY allowTransitionDefaultChanged)
 
 public:
+    /** A transition without a sender, which fires once it has been given one. */
     explicit GuardedSignalTransition(QState *sourceState = nullptr);
 
-    /** @p signal is written with SIGNAL(). */
+    /**
+     * @p signal is written with SIGNAL(). @p sender is not owned. Hangs on @p sourceState, and on
+     * the exclusive layer of one that has layers.
+     */
     GuardedSignalTransition(QObject *sender, const char *signal, QState *sourceState = nullptr);
     ~GuardedSignalTransition() override;
 
+    /** The answer to the last test, or what has been set since. */
     bool allowTransition() const;
+
+    /** What each test begins with. */
     bool allowTransitionDefault() const;
 
-    /** Asks the guard about @p e, which has matched otherwise. */
+    /**
+     * Asks the guard about @p e, which has matched otherwise: resets allowTransition, emits
+     * transitionTest(), and emits testFailed() when the answer is no.
+     */
     bool testTransition(QEvent *e);
 
+    /** Sender and signal first, then the guard. */
     bool internalEventTest(QEvent *event) override;
 
 public Q_SLOTS:
+    /** Lets the event that is being tested pass, or not. */
     void setAllowTransition(bool arg);
 
     /** Leaves allowTransition as it is until the next test. */

@@ -12,8 +12,8 @@ namespace HmiStateMachine {
  * An event transition that whoever listens may veto or allow at run time.
  *
  * For each event allowTransition is reset to allowTransitionDefault and transitionTest() is
- * emitted; receivers that are connected directly may then call setAllowTransition(), and the last
- * call wins. It denies by default.
+ * emitted, whatever the type of the event; receivers that are connected directly may then call
+ * setAllowTransition(), and the last call wins. It denies by default.
  *
  * Qt offers every newly entered configuration an event of type QEvent::None first: a guard that
  * allows it lets the transition fire as soon as its source is entered. Without a target it is not
@@ -29,10 +29,14 @@ class HMISTATEMACHINE_EXPORT GuardedTransition : public QAbstractTransition,
                    setAllowTransitionDefault NOTIFY allowTransitionDefaultChanged)
 
 public:
+    /** Hangs on @p sourceState, and on the exclusive layer of one that has layers. */
     explicit GuardedTransition(QState *sourceState = nullptr);
     ~GuardedTransition() override;
 
+    /** The answer to the last test, or what has been set since. */
     bool allowTransition() const;
+
+    /** What each test begins with. */
     bool allowTransitionDefault() const;
 
     /**
@@ -42,16 +46,22 @@ public:
     bool makeParallelExclusive(int priority);
 
 protected:
+    /** Accepts what internalEventTest() accepts, unless a sibling takes it. */
     bool eventTest(QEvent *event) override;
+
+    /** Takes the transition off the list of firing ones and passes a voice request on. */
     void onTransition(QEvent *event) override;
 
 public:
     QState *getSourceState() const override;
     void changeTarget(QState *target) override;
     QAbstractState *getTarget() const override;
+
+    /** Asks the guard, by transitionTest(). */
     bool internalEventTest(QEvent *event) override;
 
 public Q_SLOTS:
+    /** Lets the event that is being tested pass, or not. */
     void setAllowTransition(bool arg);
 
     /** Leaves allowTransition as it is until the next test. */

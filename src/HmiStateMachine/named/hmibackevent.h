@@ -17,7 +17,10 @@ public:
      */
     HmiBackEvent(unsigned char depth, const QString &targetId);
 
+    /** How many back steps remain, this one included. */
     unsigned char depth() const { return m_depth; }
+
+    /** Where to go on to after the steps; empty for nowhere. */
     QString targetId() const { return m_targetId; }
 
     /**

@@ -15,7 +15,10 @@ public:
     /** @p data is invalid when the event carries none. */
     HmiEvent(const QString &name, const QVariant &data);
 
+    /** What transitions compare with their own event name. */
     QString name() const { return m_name; }
+
+    /** What the event carries; invalid for nothing. */
     QVariant data() const { return m_data; }
 
 private:

@@ -14,6 +14,7 @@ public:
     /** An empty @p targetId leaves the choice to the view that is left. */
     explicit HmiFallbackEvent(const QString &targetId);
 
+    /** The name of the state to go to; may be empty. */
     QString targetId() const { return m_targetId; }
 
 private:

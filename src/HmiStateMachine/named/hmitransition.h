@@ -11,7 +11,7 @@ namespace HmiStateMachine {
 /**
  * Fires on HmiEvents of one name, and perhaps of one value of data.
  *
- * Unlike its base it allows by default.
+ * Unlike its base it allows by default. Type, name and data are compared before the guard is asked.
  */
 class HMISTATEMACHINE_EXPORT HmiTransition : public GuardedTransition
 {
@@ -20,6 +20,8 @@ class HMISTATEMACHINE_EXPORT HmiTransition : public GuardedTransition
 public:
     /** Reacts to events without a name. */
     explicit HmiTransition(QState *sourceState = nullptr);
+
+    /** Reacts to events named @p eventName, in the same case. */
     explicit HmiTransition(const QString &eventName, QState *sourceState = nullptr);
     ~HmiTransition() override;
 
@@ -43,9 +45,11 @@ public:
     bool makeParallelExclusive(int priority);
 
 protected:
+    /** As GuardedTransition does. */
     bool eventTest(QEvent *event) override;
 
 public:
+    /** Type, name, data, guard; the data is stored before the guard is asked. */
     bool internalEventTest(QEvent *event) override;
 
 private:

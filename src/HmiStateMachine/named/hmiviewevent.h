@@ -15,7 +15,10 @@ public:
     /** @p data reaches the entered view as "eventData"; invalid when there is none. */
     HmiViewEvent(const QString &viewId, const QVariant &data);
 
+    /** The name of a state, or else the target view of one. */
     QString viewId() const { return m_viewId; }
+
+    /** What the request carries; invalid for nothing. */
     QVariant data() const { return m_data; }
 
 private:

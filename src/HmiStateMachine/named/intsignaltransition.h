@@ -18,17 +18,19 @@ class HMISTATEMACHINE_EXPORT IntSignalTransition : public HmiSignalTransition
 public:
     /** The stored value stands on the left: Greater fires on arguments below it. */
     enum Operator : int {
-        Equal = 0,
-        NotEqual = 1,
-        Greater = 2,
-        GreaterOrEqual = 3,
-        Less = 4,
-        LessOrEqual = 5
+        Equal = 0, ///< value == argument
+        NotEqual = 1, ///< value != argument
+        Greater = 2, ///< value > argument
+        GreaterOrEqual = 3, ///< value >= argument
+        Less = 4, ///< value < argument
+        LessOrEqual = 5 ///< value <= argument
     };
 
     /** Fires when the argument equals @p value. @p signal is written with SIGNAL(). */
     IntSignalTransition(QObject *sender, const char *signal, int value,
                         QState *sourceState = nullptr);
+
+    /** Fires when @p value, @p op and the argument, read in this order, hold. */
     IntSignalTransition(QObject *sender, const char *signal, int value,
                         IntSignalTransition::Operator op, QState *sourceState = nullptr);
     ~IntSignalTransition() override;
@@ -36,6 +38,7 @@ public:
     /** Whether @p argument would fire; false for an operator that is none of the six. */
     bool match(int argument) const;
 
+    /** Sender and signal first, then the first argument. */
     bool internalEventTest(QEvent *event) override;
 
 private:

@@ -24,13 +24,18 @@ public:
     /** @p signal is written with SIGNAL(). A negative @p status accepts every status. */
     KeySignalTransition(QObject *sender, const char *signal, int key, int status,
                         QState *sourceState = nullptr);
+
+    /** Fires on any of @p keys; on none when the list is empty. */
     KeySignalTransition(QObject *sender, const char *signal, QList<int> keys, int status,
                         QState *sourceState = nullptr);
 
     /** Withdraws the transition when it was published. */
     ~KeySignalTransition() override;
 
-    /** Publishes the transition, so that keySignalTransitions() finds it. */
+    /**
+     * Publishes the transition, so that keySignalTransitions() finds it. Each call adds it once
+     * more, so one will do.
+     */
     void makeGloballyAvailable();
 
     /**
@@ -39,6 +44,8 @@ public:
      */
     static QList<KeySignalTransition *> keySignalTransitions(QObject *sender, const char *signal,
                                                              int key, int status);
+
+    /** The same for several keys, in the order in which the transition was given them. */
     static QList<KeySignalTransition *> keySignalTransitions(QObject *sender, const char *signal,
                                                              QList<int> keys, int status);
 
@@ -48,6 +55,7 @@ public:
      */
     bool makeParallelExclusive(int priority);
 
+    /** Sender and signal, key, status, and last the guard. */
     bool internalEventTest(QEvent *event) override;
 
 Q_SIGNALS:

@@ -23,6 +23,9 @@ template <typename State> class TargetIndex;
  * QSignalTransition that becomes a child of a named state ends the process with the message
  * "Raw QSignalTransition usage detected!".
  *
+ * It is made with new and belongs to its parent. On entry it is marked active, then tells the
+ * states that monitor it, and writes the log last; so it does on exit.
+ *
  * The registry may be used from any thread; all else belongs to the thread of the machine.
  */
 class HMISTATEMACHINE_EXPORT NamedState : public QState
@@ -31,14 +34,22 @@ class HMISTATEMACHINE_EXPORT NamedState : public QState
     Q_PROPERTY(Identifier name READ name WRITE setName NOTIFY nameChanged)
 
 public:
+    /** A state without a name. */
     explicit NamedState(QState *parent = nullptr);
+
+    /** A state that takes @p name as setName() does; without one when @p name is empty. */
     explicit NamedState(const QString &name, QState *parent = nullptr);
+
+    /** A state without a name, whose children are active one at a time or all together. */
     explicit NamedState(QState::ChildMode childMode, QState *parent = nullptr);
+
+    /** A state with a name, as setName() takes it, and with a child mode. */
     NamedState(const QString &name, QState::ChildMode childMode, QState *parent = nullptr);
 
     /** Frees the state's name, by that name alone; see removeFromHash(). */
     ~NamedState() override;
 
+    /** Empty while the state has none. */
     Identifier name() const;
 
     /**
@@ -54,16 +65,21 @@ public:
     static QList<NamedState *> namedStates();
 
     /**
-     * Registers @p state under @p name. False when the name is empty or the state null, or when
-     * another state holds the name, with a warning; the registry is unchanged then. Thread-safe.
+     * Registers @p state under @p name. False when the name is empty or the state null, or when a
+     * state holds the name, this one included, with a warning; the registry is unchanged then. What
+     * name() returns stays as it is, so applications call setName(). Thread-safe.
      */
     static bool hash(const QString &name, NamedState *state);
 
-    /** Frees @p name, whichever state holds it. Thread-safe. */
+    /**
+     * Frees @p name, whichever state holds it; a name that nobody holds is ignored. Thread-safe.
+     */
     static void removeFromHash(const QString &name);
 
     /** Switches the log of entries and exits for all named states; off at first. */
     static void setLoggingEnabled(bool enabled);
+
+    /** Whether entries and exits are logged. */
     static bool loggingEnabled();
 
     /** True from the state's onEntry() to its onExit(). */
@@ -79,7 +95,10 @@ public:
     HmiSignalTransition *addTransition(const QObject *sender, const char *signal,
                                        QAbstractState *target);
 
-    /** Ends the process when @p object is a signal transition that is not the library's own. */
+    /**
+     * Ends the process when @p object is a signal transition that is not the library's own. Null
+     * and all other objects pass.
+     */
     void transitionTypeTest(QObject *object);
 
     /**
@@ -92,10 +111,13 @@ public:
     void blockKey(int key, int status, QObject *sender, const char *signal);
 
     /**
-     * Lets @p state be told of every entry and exit of this state. Not owned; null and a state that
-     * is registered already are ignored. A state that is destroyed leaves the list.
+     * Lets @p state be told of every entry and exit of this state, in the order in which states
+     * were registered. Not owned; null and a state that is registered already are ignored. A state
+     * that is destroyed leaves the list.
      */
     void registerMonitoringState(NamedState *state);
+
+    /** Takes @p state off that list; nothing when it is not there. */
     void unregisterMonitoringState(NamedState *state);
 
 public Q_SLOTS:
@@ -106,17 +128,30 @@ public Q_SLOTS:
     void setName(const Identifier &name);
 
 Q_SIGNALS:
-    /** Emitted after a change; @p name is empty when the state lost its name. */
+    /**
+     * Emitted by each setName() that is given another name than the present one, after it has taken
+     * effect; @p name is empty when the state is left without one.
+     */
     void nameChanged(Identifier name);
 
 protected:
+    /** Looks at each child that is added, as transitionTypeTest() does. */
     bool event(QEvent *e) override;
+
+    /** What the class does on entry; an override calls it. */
     void onEntry(QEvent *e) override;
+
+    /** What the class does on exit; an override calls it. */
     void onExit(QEvent *e) override;
 
 public:
-    /** Subclasses take over the choice of the initial state here. */
+    /**
+     * Subclasses take over the choice of the initial state here. Hides the function of QState,
+     * which is not virtual and is the one that a machine uses.
+     */
     virtual void setInitialState(QState *state);
+
+    /** Null when there is none, or when it is no QState. */
     virtual QState *initialState() const;
 
     /** Called with the event that entered a state which this one monitors; does nothing here. */

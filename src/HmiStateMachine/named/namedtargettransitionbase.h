@@ -31,13 +31,19 @@ public:
     /** Leaves the list of firing transitions and all sibling groups. */
     virtual ~NamedTargetTransitionBase();
 
+    /** The state on which the transition hangs; null when there is none. */
     virtual QState *getSourceState() const = 0;
+
+    /** Makes @p target the target; null leaves none. */
     virtual void changeTarget(QState *target) = 0;
+
+    /** Null when there is none. */
     virtual QAbstractState *getTarget() const = 0;
 
     /**
      * The transition's own test of @p event, guard included, without the sibling groups. Asked by
      * groups on behalf of other members too, so it may run several times for one event.
+     * False here.
      */
     virtual bool internalEventTest(QEvent *event);
 
@@ -50,10 +56,17 @@ public:
     /** The target's present name; empty without a target, or when it is no NamedState. */
     QString targetName() const;
 
-    /** Marks the transition as caused by a voice request; handed to the view layer when it fires.
+    /**
+     * Marks the transition as caused by a voice request, with the request's data. When it fires
+     * this is handed to ViewStateTarget::setVRViewRequest(), except by view, back and fallback
+     * transitions.
      */
     void setIsVREventTransition(bool isVR, const QVariant &data);
+
+    /** Off at first. */
     bool isVREventTransition() const;
+
+    /** What came with that mark; invalid at first. */
     QVariant vrEventData() const;
 
     /** Lists the transition as about to fire. A transition without a target is never listed. */
@@ -73,14 +86,23 @@ public:
     bool activeSiblingTest(QEvent *event);
 
 protected:
-    /** What follows when the own test has passed: siblings, then listed as about to fire. */
+    /**
+     * What follows when the own test has passed. False when a sibling takes the event, or when an
+     * eventless transition has no target, with one warning; otherwise the transition is listed as
+     * about to fire.
+     */
     bool arbitrate(QEvent *event);
 
     /** The common end of a firing: off the list, then the voice request is passed on. */
     void finishTransition();
 
-    /** For the classes that can be blocked; kept here, where it takes no room of its own. */
+    /**
+     * What block() has stored; off at first. For the classes that can be blocked; kept here, where
+     * it takes no room of its own.
+     */
     bool isBlocked() const { return m_blocked; }
+
+    /** Stores what isBlocked() returns, and does nothing else. */
     void block(bool blocked) { m_blocked = blocked; }
 
 private:

@@ -31,6 +31,10 @@ class HMISTATEMACHINE_EXPORT ParallelSiblingTransitionGroup : public QObject
     Q_OBJECT
 
 public:
+    /**
+     * An empty group. Those that the transitions join by themselves are made by the library, as
+     * children of the application object.
+     */
     explicit ParallelSiblingTransitionGroup(QObject *parent = nullptr);
     ~ParallelSiblingTransitionGroup() override;
 
@@ -46,7 +50,10 @@ public:
     bool internalEventTest(NamedTargetTransitionBase *transition, QEvent *event) const;
 
 public Q_SLOTS:
+    /** The source state of @p transition has been entered. */
     void siblingActivated(NamedTargetTransitionBase *transition);
+
+    /** The source state of @p transition has been left. */
     void siblingDeactivated(NamedTargetTransitionBase *transition);
 
 private:
@@ -67,6 +74,7 @@ private:
 class HMISTATEMACHINE_EXPORT SiblingFunctorBase
 {
 public:
+    /** Owns none of the three, and is not called for a @p transition that is gone. */
     SiblingFunctorBase(ParallelSiblingTransitionGroup *group, NamedTargetTransitionBase *transition,
                        QAbstractState *sourceState);
 
@@ -74,8 +82,13 @@ public:
     bool sanityTest() const;
 
 protected:
+    /** The group that is told. */
     QPointer<ParallelSiblingTransitionGroup> m_group;
+
+    /** The member of the group. */
     NamedTargetTransitionBase *m_transition;
+
+    /** The state whose entries and exits count. */
     QPointer<QAbstractState> m_sourceState;
 };
 
@@ -85,6 +98,7 @@ class HMISTATEMACHINE_EXPORT SiblingActivatedFunctor : public SiblingFunctorBase
 public:
     using SiblingFunctorBase::SiblingFunctorBase;
 
+    /** Calls siblingActivated() of the group, after sanityTest(). */
     void operator()() const;
 };
 
@@ -94,6 +108,7 @@ class HMISTATEMACHINE_EXPORT SiblingDeactivatedFunctor : public SiblingFunctorBa
 public:
     using SiblingFunctorBase::SiblingFunctorBase;
 
+    /** Calls siblingDeactivated() of the group, after sanityTest(). */
     void operator()() const;
 };
 

@@ -20,7 +20,11 @@ public:
 
     /** The name of the popup, or a dismiss identifier. */
     QString target() const { return m_target; }
+
+    /** Whether an interrupted popup returns; such a request is never refused. */
     bool isReactivation() const { return m_reactivation; }
+
+    /** What the request carries; invalid for nothing. */
     QVariant data() const { return m_data; }
 
 private:

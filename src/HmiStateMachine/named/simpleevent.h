@@ -6,11 +6,11 @@ namespace HmiStateMachine {
 
 /** The library's events: each value is the distance of the event's type from QEvent::User. */
 enum SimpleEventType : int {
-    HmiEventType = 260,
-    HmiViewEventType = 261,
-    PopupEventType = 262,
-    HmiBackEventType = 263,
-    HmiFallbackEventType = 264
+    HmiEventType = 260, ///< HmiEvent
+    HmiViewEventType = 261, ///< HmiViewEvent
+    PopupEventType = 262, ///< PopupEvent
+    HmiBackEventType = 263, ///< HmiBackEvent
+    HmiFallbackEventType = 264 ///< HmiFallbackEvent
 };
 
 /**
@@ -20,6 +20,7 @@ enum SimpleEventType : int {
 template <SimpleEventType N> class SimpleEvent : public QEvent
 {
 public:
+    /** An event of the type eventType(). */
     SimpleEvent() : QEvent(eventType()) { }
 
     ~SimpleEvent() override = default;

@@ -16,7 +16,13 @@ class HMISTATEMACHINE_EXPORT SimpleEventTransition : public QAbstractTransition,
     Q_OBJECT
 
 public:
+    /**
+     * Reacts to events of @p type. Hangs on @p sourceState, and on the exclusive layer of one that
+     * has layers.
+     */
     explicit SimpleEventTransition(QEvent::Type type, QState *sourceState = nullptr);
+
+    /** Reacts to events of any of @p types; to none when the list is empty. */
     explicit SimpleEventTransition(const QList<QEvent::Type> &types, QState *sourceState = nullptr);
     ~SimpleEventTransition() override;
 
@@ -25,7 +31,11 @@ public:
 
     /** The first type; QEvent::None when there is none. */
     QEvent::Type eventType() const;
+
+    /** Replaces all types. A group that was joined before is not left. */
     void setEventTypes(const QList<QEvent::Type> &types);
+
+    /** All types, in the order in which they were given. */
     QList<QEvent::Type> eventTypes() const;
 
     /**
@@ -35,13 +45,18 @@ public:
     bool makeParallelExclusive(int priority);
 
 protected:
+    /** Accepts an event of one of the types, unless a sibling takes it. */
     bool eventTest(QEvent *event) override;
+
+    /** Takes the transition off the list of firing ones and passes a voice request on. */
     void onTransition(QEvent *event) override;
 
 public:
     QState *getSourceState() const override;
     void changeTarget(QState *target) override;
     QAbstractState *getTarget() const override;
+
+    /** Whether the type of @p event is one of the types. */
     bool internalEventTest(QEvent *event) override;
 
 private:

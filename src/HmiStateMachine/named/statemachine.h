@@ -34,8 +34,8 @@ public:
     static StateMachine *instance();
 
     /**
-     * Watches @p state from its next entry or exit on; the flag is not computed now. Not owned. An
-     * earlier state stays connected, but only the latest one decides.
+     * Watches @p state, which must not be null, from its next entry or exit on; the flag is not
+     * computed now. Not owned. An earlier state stays connected, but only the latest one decides.
      */
     void setInfotainmentState(HmiState *state);
 

@@ -31,6 +31,7 @@ class HMISTATEMACHINE_EXPORT ViewStateTarget : public QObject
     Q_PROPERTY(Identifier activeView READ activeView NOTIFY activeViewChanged)
 
 public:
+    /** Publishes nothing: that is up to the application. */
     explicit ViewStateTarget(QObject *parent = nullptr);
     ~ViewStateTarget() override;
 
@@ -43,18 +44,32 @@ public:
     /** What the application has set; may be null. */
     static ViewStateTarget *instance();
 
-    /** Shows a view. @p instanceData is a map with the keys "eventData", "entryReason" and others.
+    /**
+     * Shows a view; called at the end of its entry. @p instanceData is a map with the keys
+     * "eventData" and "entryReason", from the second entry on "exitReason", and what
+     * HmiViewState::addInstanceData() has added.
      */
     virtual void activateView(const QString &viewId, const QVariant &instanceData) = 0;
 
-    /** Tells that a view has been left; the map has "exitReason" besides. */
+    /** Tells that a view is being left; the map has "exitReason" in any case. */
     virtual void deactivateView(const QString &viewId, const QVariant &instanceData) = 0;
 
     /** Announces a popup before it is shown; @p reactivation when it had been interrupted. */
     virtual void preparePopup(const QString &popupId, bool reactivation) = 0;
+
+    /**
+     * Shows a popup, on its entry or because its domain or view does not block it any more.
+     * @p popupKind is the number that the application gave to the popup state, @p data its instance
+     * data, a map: "eventData", when a request brought some, and what PopupState::addInstanceData()
+     * has added.
+     */
     virtual void requestPopupShow(const QString &popupId, int popupKind, const QVariant &data) = 0;
 
-    /** @p deactivated is true when the popup will not come back. */
+    /**
+     * Hides a popup, perhaps one that is hidden already. @p deactivated is true when it will not
+     * come back. A popup layer that is left or reset names the popups that were to return by their
+     * states, not by their popup view ids.
+     */
     virtual void requestPopupHide(const QString &popupId, bool deactivated) = 0;
 
     /**
@@ -62,17 +77,32 @@ public:
      * popup that covers it and is for the use of overriding classes.
      */
     virtual void stackPopup(const QString &popupId, const QString &stackingPopupId);
+
+    /**
+     * Takes a popup off the popup stack; nothing when it is not there, as for most popups that are
+     * shown or hidden.
+     */
     virtual void unstackPopup(const QString &popupId);
 
-    /** The application's number for a domain that the popup interruption file names. */
+    /**
+     * The application's number for a domain that the popup interruption file names, to be compared
+     * with activeDomain().
+     */
     virtual int domainFromName(const QString &domainName) = 0;
+
+    /** The number of the domain whose blacklists count. */
     virtual int activeDomain() const = 0;
+
+    /** The view whose blacklists count. */
     virtual Identifier activeView() const = 0;
 
     /** Requests again a popup that its domain had blocked. */
     virtual void retryBlockedPopup(PopupState *popup) = 0;
 
-    /** Hands over the popups whose requests were refused, each with the time of refusal. */
+    /**
+     * Hands over the popups whose requests were refused, each with the time of refusal; called when
+     * PopupState::setStoreBlockedPopups() is switched off. They are not kept any longer.
+     */
     virtual void releaseBlockedPopups(const QMap<PopupState *, QTime> &blockedPopups) = 0;
 
     /**
@@ -87,6 +117,8 @@ public:
 
     /** A screen was entered that leaves popups as they are by default. */
     virtual void resetScreenPopupBehavior() = 0;
+
+    /** The popup that is shown was requested again; @p data is its new instance data. */
     virtual void updatePopupData(const QString &popupId, const QVariant &data) = 0;
 
     /** The popups on the popup stack, oldest first. */
@@ -97,21 +129,57 @@ public:
 
     /** Marks that a view was requested by voice, with the request's data; stays until changed. */
     void setVRViewRequest(bool request, const QVariant &data);
+
+    /** Off at first. */
     bool vrViewRequest() const;
+
+    /** Invalid at first. */
     QVariant vrViewRequestData() const;
 
 Q_SIGNALS:
+    /**
+     * To be emitted by the application when activeDomain() is another one by now. Popups that are
+     * entered hide or show themselves by it, and those that wait for a domain come to
+     * retryBlockedPopup().
+     */
     void activeDomainChanged(int newDomain, int oldDomain);
+
+    /**
+     * To be emitted by the application when activeView() is another one by now. Popups that are
+     * entered hide or show themselves by it.
+     */
     void activeViewChanged(Identifier newViewId, Identifier oldViewId);
+
+    /** To be emitted by the application before a view is shown. The library does not listen. */
     void viewAboutToBeActivated(Identifier oldViewId, Identifier newViewId);
+
+    /**
+     * To be emitted by the application when the view is shown. The active view state passes it on,
+     * if it has been told to: see HmiViewState::setReportsQmlViewStatus().
+     */
     void viewActivated(Identifier oldViewId, Identifier newViewId);
+
+    /**
+     * To be emitted by the application when a popup has been shown or hidden; @p popupId is its
+     * popup view id. A popup's auto-dismiss time begins with it.
+     */
     void popupStatusChanged(Identifier popupId, bool shown);
+
+    /**
+     * To be emitted by the application when a view begins to move; what @p type means is up to it.
+     */
     void viewAnimationStarted(Identifier viewId, int type);
 
-    /** @p viewId is the id of the popup. */
+    /**
+     * To be emitted by the application when a popup begins to move. @p viewId is its popup view id;
+     * what @p type means is up to the application.
+     */
     void popupAnimationStarted(Identifier viewId, int type);
 
-    /** Emitted by the library, with the activation data of the active view. */
+    /**
+     * Emitted by the library, with the activation data of the active view: on its entry and on each
+     * change. A dummy view tells only data that is valid on its entry.
+     */
     void activeViewDataChanged(QVariant data);
 
 private:

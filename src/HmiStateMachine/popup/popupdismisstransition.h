@@ -32,7 +32,9 @@ public:
     explicit PopupDismissTransition(PopupState *popup);
     ~PopupDismissTransition() override;
 
-    /** @p s followed by "_Dismiss" becomes the dismiss identifier; empty: cannot be dismissed. */
+    /**
+     * @p s followed by "_Dismiss" becomes the dismiss identifier; with an empty one there is none.
+     */
     void setDismissTarget(const QString &s);
 
     /** The same for the identifier by the popup's view. */
@@ -40,6 +42,8 @@ public:
 
     /** The dismiss identifier; empty when the popup cannot be dismissed. */
     QString dismissTargetSigniture() const;
+
+    /** Whether there is a dismiss identifier. */
     bool isDismissable() const;
 
     /** Whether @p e dismisses this popup. An event with an empty target dismisses none. */
@@ -49,11 +53,21 @@ public Q_SLOTS:
     /** Follows a change of the popup's name. */
     void sourceNameChanged(Identifier identifier);
 
-    /** Posts the dismiss event to the machine; nothing while the popup belongs to none. */
+    /**
+     * Posts the dismiss event to the machine of the popup; nothing while it belongs to none.
+     * Without a dismiss identifier the event dismisses nothing.
+     */
     void trigger();
 
 protected:
+    /**
+     * Gives the popup up by PopupState::deactivate() when @p event dismisses it, and accepts it
+     * when the popup is the active child of its root. An event of another kind is refused, and
+     * changes nothing.
+     */
     bool eventTest(QEvent *event) override;
+
+    /** Does nothing. */
     void onTransition(QEvent *event) override;
 
 private:

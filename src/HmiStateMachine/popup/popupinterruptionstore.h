@@ -43,6 +43,7 @@ class HMISTATEMACHINE_EXPORT PopupInterruptionStore : public QObject
     Q_OBJECT
 
 public:
+    /** An empty store. The library itself asks instance() alone. */
     explicit PopupInterruptionStore(QObject *parent = nullptr);
     ~PopupInterruptionStore() override;
 
@@ -52,32 +53,54 @@ public:
     /**
      * Adds the rules of a JSON file to those that are there; a later entry replaces an earlier one
      * for the same popup. Each fault is a warning with its indexes, and the rest is loaded; a file
-     * that cannot be read or parsed loads nothing. Domain names are turned into numbers by the view
-     * layer, so publish that first.
+     * that cannot be read or parsed loads nothing, with a warning. A default that is none of the
+     * four behaviours is stored as -1, without one.
+     *
+     * Domain names are turned into numbers by the view layer, so publish that first; without it no
+     * domain blacklist is loaded.
      */
     void loadInterruptionBehaviors(const QString &fileName);
 
+    /**
+     * Adds one rule, or replaces the one for the same two names, which may be wildcards: what
+     * @p popup, being in front, answers to a request for @p target.
+     */
     void insertInterruptionBehavior(PopupState::InterruptionBehavior behavior, const QString &popup,
                                     const QString &target);
 
-    /** What @p popup, being in front, answers to a request for @p target. */
+    /**
+     * What @p popup, being in front, answers to a request for @p target; Allow without a rule, -1
+     * where the default that applies was not valid.
+     */
     PopupState::InterruptionBehavior getInterruptionBehavior(const QString &popup,
                                                              const QString &target) const;
+
+    /** By the names of the two states, neither of which may be null. */
     PopupState::InterruptionBehavior getInterruptionBehavior(const PopupState *popup,
                                                              const PopupState *target) const;
 
+    /** Whether the domain blacklist that applies to a popup view id holds the number @p domain. */
     bool isBlockedByDomain(const QString &popup, int domain) const;
 
     /** By the active domain; false without a view layer. */
     bool isBlockedByDomain(const QString &popup) const;
+
+    /** By its popup view id; it must not be null. */
     bool isBlockedByDomain(const PopupState *popup, int domain) const;
+
+    /** By its popup view id and the active domain; false without a view layer. */
     bool isBlockedByDomain(const PopupState *popup) const;
 
+    /** Whether the view blacklist that applies to a popup view id holds @p view. */
     bool isBlockedByView(const QString &popup, const QString &view) const;
 
     /** By the active view; false without a view layer. */
     bool isBlockedByView(const QString &popup) const;
+
+    /** By its popup view id; it must not be null. */
     bool isBlockedByView(const PopupState *popup, const QString &view) const;
+
+    /** By its popup view id and the active view; false without a view layer. */
     bool isBlockedByView(const PopupState *popup) const;
 
 private:

@@ -17,7 +17,8 @@ class PopupTransition;
  *
  * A popup that is interrupted by another one of the layer returns when that one goes away, unless
  * it was dismissed meanwhile: the one that was in front last comes first. HmiLayeredState makes one
- * root a layer.
+ * root a layer, and a root may also stand alone. Entering it leads to the no-popup state; leaving
+ * it takes back everything that was shown, as handleReset() does.
  */
 class HMISTATEMACHINE_EXPORT PopupRootState : public NamedState
 {
@@ -31,10 +32,16 @@ public:
     explicit PopupRootState(const QString &name, QState *parent = nullptr);
     ~PopupRootState() override;
 
+    /** The child that is active while no popup is; made and owned by this root. */
     PopupState *noPopupState() const;
 
-    /** The child that was entered last; null until the layer has been entered. */
+    /**
+     * The child that was entered last, also when the layer has been left since; null until it is
+     * entered.
+     */
     PopupState *activePopupState() const;
+
+    /** Whether @p popup is the child that was entered last; false for null. */
     bool isActivePopupState(const PopupState *popup) const;
 
     /** Lets @p popup be requested in this layer; null and a popup that is there are ignored. */
@@ -53,7 +60,10 @@ public:
     /** True when @p popup will not return; also for null. */
     bool wasDeactivated(PopupState *popup) const;
 
-    /** Takes back everything that was shown or stacked in this layer. */
+    /**
+     * Has every popup of this layer that is shown, stacked or to return hidden by the view layer,
+     * and forgets which were to return. What is entered stays entered.
+     */
     void handleReset();
 
 Q_SIGNALS:
@@ -65,6 +75,7 @@ public Q_SLOTS:
     void clearPopups();
 
 protected:
+    /** Leads to handleReset(). */
     void onExit(QEvent *event) override;
 
 private:

@@ -24,10 +24,12 @@ class PopupRootState;
  * One popup, which lives in the popup layer of a PopupRootState and is requested by a PopupEvent of
  * its name.
  *
- * While it is entered it asks the view layer to show its popup view, unless the active domain or
- * view blocks it. It is left by a dismiss event (see PopupDismissTransition), by its timeout, by a
- * driver restriction, or because another popup interrupts it; whether it may be interrupted, and
- * whether it comes back, the PopupInterruptionStore says.
+ * It belongs to its root. On entry it becomes the popup in front and asks the view layer to show
+ * its popup view, unless the active domain blocks it; while it is entered, a change of the active
+ * domain or view hides it, or shows it again. On exit it is hidden, or put on the popup stack. It
+ * is left by a dismiss event (see PopupDismissTransition), by its timeout, by a driver restriction,
+ * or because another popup interrupts it; whether it may be interrupted, and whether it comes back,
+ * the PopupInterruptionStore says.
  *
  * Belongs to the thread of the machine.
  */
@@ -62,12 +64,19 @@ public:
 
     /** The id towards the view layer; the state's name unless it was set. */
     QString popupViewId() const;
+
+    /**
+     * Also makes the dismiss identifier by the view anew. A popup that is shown is not told again.
+     */
     void setPopupViewId(const QString &id);
 
     /** The target of the PopupEvent that dismisses this popup; empty when it cannot be. */
     QString dismissEventIdentifier() const;
+
+    /** Owned by the popup, although it hangs on the root while the popup waits. */
     PopupDismissTransition *dismissTransition() const;
 
+    /** Null while it has none. */
     PopupRootState *rootPopupState() const;
 
     /** Moves the popup to another root, which becomes its parent. */
@@ -87,22 +96,32 @@ public:
 
     /** While set, interruption() decides in place of the interruption store. */
     bool hasOwnInterruptionBehavior() const;
+
+    /** Off at first. */
     void setHasOwnInterruptionBehavior(bool own);
 
-    /** Lets the popup follow the view layer's reports: popupShown(), popupHidden(). Off at first.
+    /**
+     * Lets the popup follow the view layer's reports: popupShown(), popupHidden(),
+     * popupAnimationStarted(). Off at first.
      */
     bool reportsQmlPopupStatus() const;
+
+    /** Counts at once for a popup that is active, else from its next entry on. */
     void setReportsQmlPopupStatus(bool on);
 
     /**
      * Lets the popup dismiss itself. The time runs from when the view layer reports it shown, and
-     * on while it is interrupted and will come back.
+     * on while it is interrupted and will come back. Switching it off stops the time. Off at first.
      */
     void setAutoDismissTimeoutActive(bool on);
+
+    /** Whether the popup dismisses itself. */
     bool autoDismissActive() const;
 
     /** In milliseconds; 5000 unless set. */
     void setAutoDismissTimeoutInterval(int ms);
+
+    /** In milliseconds. */
     int autoDismissInterval() const;
 
     /** Starts the time anew when it runs. */
@@ -110,7 +129,14 @@ public:
 
     /** In milliseconds; 0 while no time runs. Qt's coarse timers may stray by a twentieth. */
     int autoDismissRemainingTime() const;
+
+    /**
+     * What the end of the time fires; null before auto-dismiss is first switched on, and without a
+     * root.
+     */
     HmiSignalTransition *autoDismissTransition() const;
+
+    /** Makes that transition once; nothing while auto-dismiss is off or there is no root. */
     void addAutoDismissTransition();
 
     /** Lets the firing of @p t give this popup up and close it; null is a warning. */
@@ -128,14 +154,23 @@ public:
 
     /** Closes the popup when that property takes that value; nothing while it is incomplete. */
     void setDriverRestricted(bool on);
+
+    /** Off at first, and while the property was incomplete when it was switched on. */
     bool driverRestricted() const;
 
+    /** Adds to the map that the view layer is given, from the next time the popup is shown on. */
     void addInstanceData(const QString &key, const QVariant &value);
+
+    /** A key that is not there is ignored. */
     void removeInstanceData(const QString &key);
 
     /** The popup of the process that was entered last and not left; null when there is none. */
     static PopupState *getActivePopupState();
+
+    /** Whether @p popup is entered; false for null and for a no-popup state. */
     static bool isStateActive(PopupState *popup);
+
+    /** Whether a popup with that popup view id is entered. */
     static bool isStateActive(const QString &popupViewId);
 
     /** The popup named @p target, or else the first with that popup view id; else null. */
@@ -147,65 +182,140 @@ public:
      */
     static void setStoreBlockedPopups(bool store);
 
-    /** The request for @p p was refused. */
+    /**
+     * The request for @p p, which must not be null, was refused: unless it looks after that itself,
+     * it is kept with the time while setStoreBlockedPopups() is on.
+     */
     static void popupBlocked(PopupState *p);
+
+    /**
+     * Whether the popup looks after it itself: handleDomainBlocked() or else
+     * handleInterruptionBlocked().
+     */
     bool handleBlocked();
 
-    /** Is covered by @p over, which stacks it. */
+    /**
+     * Is covered by @p over, which must not be null: a popup of another layer goes on the popup
+     * stack now, one of the same layer when it is left.
+     */
     void stack(PopupState *over);
 
-    /** Lets reactions without a target work on while the popup waits behind others. */
+    /**
+     * Lets reactions without a target work on while the popup waits behind others: they hang on the
+     * root then.
+     */
     void stackTransitions();
+
+    /** Takes those reactions back. */
     void unstackTransitions();
 
     /** Points the dismiss transition at the no-popup state, or at nothing while not active. */
     void activateDismissTransition();
 
-    /** A request for the popup that is shown already brings new data. */
+    /**
+     * A request for the popup that is shown already brings new data, which
+     * ViewStateTarget::updatePopupData() is given; null is ignored.
+     */
     void updateEventData(QEvent *e);
 
+    /** Begins or ends to listen to the view layer's reports; nothing without a view layer. */
     void setPopupStatusConnectionActive(bool on);
 
 Q_SIGNALS:
+    /** The auto-dismiss time has run out. */
     void popupTimeOut();
+
+    /**
+     * A request was granted. Emitted while the request is tested, before any state is left or
+     * entered.
+     */
     void aboutToBeActivated();
 
     /** The popup was requested while it was the current one. */
     void alreadyActivated();
 
-    /** A request was refused. */
+    /**
+     * A request was refused, and has been kept or looked after. A popup that returns is never
+     * refused, and a request that a stacked popup prohibits is dropped without this.
+     */
     void blocked();
+
+    /** The driver must not be distracted; the popup is given up right after. */
     void exitingDueToDriverRestrictions();
+
+    /**
+     * The view layer has reported it hidden. Emitted while reports are followed; see
+     * setReportsQmlPopupStatus(). A popup that has ever dismissed itself follows them too.
+     */
     void popupHidden();
+
+    /** The view layer has reported it shown. Emitted when popupHidden() would be. */
     void popupShown();
+
+    /** The view layer has reported that it begins to move. Emitted when popupHidden() would be. */
     void popupAnimationStarted(int type);
 
 public Q_SLOTS:
-    /** Makes way for @p target for good. */
+    /**
+     * Makes way for @p target for good: is given up when that is of the same root, else dismissed.
+     */
     void deactivateSource(PopupState *target);
 
     /** Gives the popup up: it is hidden, and will not return. */
     void deactivate();
+
+    /** Hides or shows the popup when its domain blacklist has one of the two and not the other. */
     void activeDomainChanged(int newDomain, int oldDomain);
+
+    /** Hides or shows the popup when its view blacklist has one of the two and not the other. */
     void activeViewChanged(Identifier newView, Identifier oldView);
 
     /** Does nothing; auto-dismiss is connected to it for the sake of subclasses. */
     void stateEntry();
+
+    /** Stops the auto-dismiss time, unless the popup will come back. */
     void stateExit();
+
+    /** A report of the view layer; one about another popup view id is ignored. */
     void onViewStateTargetPopupStateChanged(Identifier popupId, bool shown);
+
+    /** A report of the view layer; one about another popup view id is ignored. */
     void onPopupAnimationStarted(Identifier popupId, int type);
 
 protected:
+    /**
+     * Becomes the popup in front, takes the data of the request, and is shown unless its domain
+     * blocks it. A popup that cannot be dismissed is a warning.
+     */
     void onEntry(QEvent *e) override;
+
+    /** Is hidden or stacked, and leaves its dismiss transition with the root. */
     void onExit(QEvent *e) override;
 
 public:
-    /** How this popup, being in front, answers a request for @p requested; Allow here. */
+    /**
+     * How this popup, being in front, answers a request for @p requested; asked while
+     * hasOwnInterruptionBehavior(). Allow here.
+     */
     virtual InterruptionBehavior interruption(PopupState *requested) const;
 
-    /** Announces the popup to the view layer; @p reactivation when it returns. */
+    /**
+     * Announces the popup to the view layer and emits aboutToBeActivated(); @p reactivation when it
+     * returns although it would have been refused.
+     */
     virtual void prepareForActivation(bool reactivation);
+
+    /**
+     * Asks the view layer to show the popup, takes it off the popup stack, and writes a warning on
+     * purpose: every popup that comes up is to be found in the log. @p activated is true on entry,
+     * false when the active domain or view has let go; it changes nothing here.
+     */
     virtual void showPopup(bool activated);
+
+    /**
+     * Asks the view layer to hide the popup, or to stack it when one of its own layer covers it.
+     * @p deactivated is false when the active domain or view blocks it; it changes nothing here.
+     */
     virtual void hidePopup(bool deactivated);
 
     /** Whether the popup looks after a request that its domain blocked itself; false here. */

@@ -23,6 +23,7 @@ class HMISTATEMACHINE_EXPORT PopupTransition : public QAbstractTransition
     Q_OBJECT
 
 public:
+    /** Without a source; the root hangs it on the child that is active. */
     PopupTransition();
     ~PopupTransition() override;
 
@@ -39,7 +40,13 @@ public:
     bool blockedByStacked(PopupState *popup) const;
 
 protected:
+    /**
+     * Accepts the request for a popup that may come up. One for the popup that is the active child
+     * brings it new data, and one for a popup of another layer is left to that layer.
+     */
     bool eventTest(QEvent *event) override;
+
+    /** Does nothing. */
     void onTransition(QEvent *event) override;
 
 private:
