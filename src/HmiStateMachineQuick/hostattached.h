@@ -19,9 +19,11 @@ class HMISTATEMACHINEQUICK_EXPORT HostAttached : public QObject
     Q_PROPERTY(qreal position READ position NOTIFY positionChanged)
 
 public:
+    /** Made by QML, once for each item; the item owns it. */
     explicit HostAttached(QObject *parent = nullptr);
     ~HostAttached() override;
 
+    /** 0 at first. */
     qreal position() const;
 
     /** Called by the host. */

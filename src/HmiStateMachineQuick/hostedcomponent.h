@@ -18,6 +18,7 @@ class HMISTATEMACHINEQUICK_EXPORT HostedComponent : public QObject
     Q_CLASSINFO("DefaultProperty", "delegate")
 
 public:
+    /** Made by QML, as a child of a host. */
     explicit HostedComponent(QObject *parent = nullptr);
     ~HostedComponent() override;
 
@@ -26,6 +27,8 @@ public:
 
     /** Not owned; null when there is none. */
     QQmlComponent *delegate() const;
+
+    /** Null leaves the choice to the source. */
     void setDelegate(QQmlComponent *component);
 
 Q_SIGNALS:

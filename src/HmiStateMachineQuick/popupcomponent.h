@@ -25,6 +25,7 @@ class HMISTATEMACHINEQUICK_EXPORT PopupComponent : public HostedComponent
     Q_PROPERTY(int kind MEMBER m_kind NOTIFY kindChanged)
 
 public:
+    /** Made by QML, as a child of a PopupHost. */
     explicit PopupComponent(QObject *parent = nullptr);
     ~PopupComponent() override;
 

@@ -40,9 +40,11 @@ class HMISTATEMACHINEQUICK_EXPORT PopupHost : public SceneHost, public PopupPres
     Q_PROPERTY(QQuickItem *topItem READ topItem NOTIFY topItemChanged)
 
 public:
+    /** Made by QML. Its effect is Fade at first. */
     explicit PopupHost(QQuickItem *parent = nullptr);
     ~PopupHost() override;
 
+    /** Called by QML for PopupHost.position; owned by @p object. */
     static HostAttached *qmlAttachedProperties(QObject *object);
 
     /**
@@ -50,6 +52,8 @@ public:
      * their time runs.
      */
     QStringList suppressedLayers() const;
+
+    /** Counts at once; a layer is named by its layered state. */
     void setSuppressedLayers(const QStringList &layers);
 
     /** The popup in front that is neither covered nor suppressed; null when there is none. */
@@ -64,8 +68,12 @@ Q_SIGNALS:
     void topItemChanged();
 
 protected:
+    /** Becomes the popup presenter, and presents the popups that are shown already. */
     void attach(QuickViewStateTarget *target) override;
+
+    /** Withdraws as the popup presenter. */
     void detach(QuickViewStateTarget *target) override;
+
     void clear() override;
     HostedComponent *declaredComponent(const QString &id) const override;
 

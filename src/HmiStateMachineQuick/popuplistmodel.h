@@ -34,23 +34,33 @@ class HMISTATEMACHINEQUICK_EXPORT PopupListModel : public QAbstractListModel
     Q_PROPERTY(int count READ count NOTIFY countChanged)
 
 public:
+    /** What a row is asked for; by these names in QML. */
     enum Role {
-        PopupIdRole = Qt::UserRole + 1,
-        KindRole,
-        PopupDataRole,
-        LayerRole,
-        RemainingTimeRole,
-        TotalTimeRole,
-        CoveredRole
+
+        PopupIdRole = Qt::UserRole + 1, ///< "popupId", a text
+        KindRole, ///< "kind", an integer
+        PopupDataRole, ///< "popupData", a map
+        LayerRole, ///< "layer", a text
+        RemainingTimeRole, ///< "remainingTime", in milliseconds
+        TotalTimeRole, ///< "totalTime", in milliseconds
+        CoveredRole ///< "covered", a bool
     };
     Q_ENUM(Role)
 
+    /** An empty list. */
     explicit PopupListModel(QObject *parent = nullptr);
     ~PopupListModel() override;
 
+    /** How many popups there are. */
     int count() const;
+
+    /** How many popups there are; 0 below a row. */
     int rowCount(const QModelIndex &parent = QModelIndex()) const override;
+
+    /** Invalid for a row that is not there, and for any other role. */
     QVariant data(const QModelIndex &index, int role) const override;
+
+    /** The names that stand beside the roles above. */
     QHash<int, QByteArray> roleNames() const override;
 
     /** The row of that popup; -1 when it is not in the list. */

@@ -25,8 +25,8 @@ struct HMISTATEMACHINEQUICK_EXPORT LoadError
 {
     QString id; ///< the view or the popup that was to be shown
     QUrl file; ///< empty when there is no component at all
-    int line = -1;
-    QString text;
+    int line = -1; ///< in that file; -1 when unknown
+    QString text; ///< what the engine says
 };
 
 /**
@@ -77,13 +77,20 @@ class HMISTATEMACHINEQUICK_EXPORT QuickViewStateTarget : public ViewStateTarget
 
 public:
     /** What viewAnimationStarted() carries. */
-    enum ViewAnimation { ForwardAnimation = 1, BackAnimation = 2 };
+    enum ViewAnimation {
+        ForwardAnimation = 1, ///< a request led to the view
+        BackAnimation = 2 ///< a back press led to the view
+    };
     Q_ENUM(ViewAnimation)
 
     /** What popupAnimationStarted() carries. */
-    enum PopupAnimation { AppearAnimation = 1, DisappearAnimation = 2 };
+    enum PopupAnimation {
+        AppearAnimation = 1, ///< the popup begins to appear
+        DisappearAnimation = 2 ///< the popup begins to disappear
+    };
     Q_ENUM(PopupAnimation)
 
+    /** Publishes itself in place of whoever was published. */
     explicit QuickViewStateTarget(QObject *parent = nullptr);
     ~QuickViewStateTarget() override;
 
@@ -93,6 +100,8 @@ public:
     /** The names of the domains; a domain's number is its index here. Set before rules are loaded.
      */
     QStringList domains() const;
+
+    /** The number of the active domain is looked up anew. */
     void setDomains(const QStringList &names);
 
     /** Empty before the first view. */
@@ -109,6 +118,8 @@ public:
      * or to a state without a name.
      */
     QString backTarget() const;
+
+    /** Whether back leads anywhere, also to a state without a name. */
     bool isBackPossible() const;
 
     /** False while a screen is active that has switched popups off. */
@@ -126,20 +137,46 @@ public:
     /** Owned by this object. */
     Requests *requests() const;
 
-    /** The one who shows views; null for nobody. Not owned, has to withdraw before it dies. */
+    /**
+     * The one who shows views from now on; null for nobody. It is not told of a view that is active
+     * already. Not owned, has to withdraw before it dies.
+     */
     void setViewPresenter(ViewPresenter *presenter);
+
+    /** Null while nobody shows views. */
     ViewPresenter *viewPresenter() const;
 
-    /** The one who shows popups; null for nobody. Not owned, has to withdraw before it dies. */
+    /**
+     * The one who shows popups from now on; null for nobody. It is not told of popups that are
+     * shown already. Not owned, has to withdraw before it dies.
+     */
     void setPopupPresenter(PopupPresenter *presenter);
+
+    /** Null while nobody shows popups. */
     PopupPresenter *popupPresenter() const;
 
-    // Reports of the presenters. Those about a view that is not active any more are dropped.
+    /**
+     * A presenter begins to move the view in: emits viewAnimationStarted(), unless the view is not
+     * the active one any more or has been reported shown.
+     */
     void reportViewAnimationStarted(const QString &viewId, ViewAnimation type);
+
+    /**
+     * A presenter shows the view: emits viewActivated(), once for each activation of the view, and
+     * not for a view that is not the active one any more.
+     */
     void reportViewShown(const QString &viewId);
+
+    /** A presenter begins to move the popup: emits popupAnimationStarted(). */
     void reportPopupAnimationStarted(const QString &popupId, PopupAnimation type);
+
+    /** A presenter shows the popup: emits popupStatusChanged(). */
     void reportPopupShown(const QString &popupId);
+
+    /** A presenter has hidden the popup: emits popupStatusChanged(). */
     void reportPopupHidden(const QString &popupId);
+
+    /** A presenter cannot show what @p error names: writes a warning and emits loadFailed(). */
     void reportLoadError(const LoadError &error);
 
     /** A presenter has become busy or idle. */
@@ -151,20 +188,40 @@ public:
 public:
     void activateView(const QString &viewId, const QVariant &instanceData) override;
     void deactivateView(const QString &viewId, const QVariant &instanceData) override;
+
+    /** Does nothing: components are made when they are shown. */
     void preparePopup(const QString &popupId, bool reactivation) override;
+
     void requestPopupShow(const QString &popupId, int popupKind, const QVariant &data) override;
     void requestPopupHide(const QString &popupId, bool deactivated) override;
     void stackPopup(const QString &popupId, const QString &stackingPopupId) override;
     void unstackPopup(const QString &popupId) override;
+
+    /** The index in domains(); -1 for a name that is not among them. */
     int domainFromName(const QString &domainName) override;
+
     int activeDomain() const override;
     Identifier activeView() const override;
+
+    /** Requests @p popup from StateMachine::instance(). */
     void retryBlockedPopup(PopupState *popup) override;
+
+    /**
+     * Requests them from StateMachine::instance(), the one that was refused first before all
+     * others.
+     */
     void releaseBlockedPopups(const QMap<PopupState *, QTime> &blockedPopups) override;
+
+    /** Posts to StateMachine::instance(). A target that is no view is not gone on to. */
     void postFollowOnBackEvent(quint8 backDepth, const QString &backTargetId,
                                const QString &viewId) override;
+
+    /** Becomes popupsEnabled(). */
     void setScreenPopupBehavior(bool enabled) override;
+
+    /** Switches popupsEnabled() on. */
     void resetScreenPopupBehavior() override;
+
     void updatePopupData(const QString &popupId, const QVariant &data) override;
 
     /** The domain of a view: what stands before the first slash of its id. */

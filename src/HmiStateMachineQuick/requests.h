@@ -27,15 +27,20 @@ class HMISTATEMACHINEQUICK_EXPORT Requests : public QObject
     Q_PROPERTY(QVariantMap keys READ keys WRITE setKeys NOTIFY keysChanged)
 
 public:
+    /** Made by the QuickViewStateTarget. */
     explicit Requests(QObject *parent = nullptr);
     ~Requests() override;
 
     /** On in debug builds of this component, off in others. */
     bool checksIds() const;
+
+    /** Counts from the next request on. */
     void setChecksIds(bool on);
 
     /** The application's key codes by name; empty at first. */
     QVariantMap keys() const;
+
+    /** Replaces all codes: names to integers. */
     void setKeys(const QVariantMap &codes);
 
     /** A view, by the name of its state or by its view id, or any other state that shows one. */
@@ -56,12 +61,16 @@ public:
     /** Dismisses whichever popup is in front, in each layer. */
     Q_INVOKABLE void dismissAny();
 
-    using QObject::event; // stays in sight beside what follows
+    /** QObject's own stays in sight beside the request of that name. */
+    using QObject::event;
 
     /** An HmiEvent, whose names only the transitions know. */
     Q_INVOKABLE void event(const QString &name, const QVariant &data = QVariant());
 
-    /** Emits keyChanged() with the code of that key. A name that is not among keys is a warning. */
+    /**
+     * Emits keyChanged() with the code of that key. A name that is not among keys is a warning
+     * while checksIds is on, and nothing is emitted.
+     */
     Q_INVOKABLE void key(const QString &name, int status);
 
 Q_SIGNALS:

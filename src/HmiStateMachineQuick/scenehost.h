@@ -37,8 +37,8 @@ public:
     /** How items move in and out. */
     enum Effect {
         NoEffect, ///< not by the host: items bind to the attached position
-        Fade,
-        Slide
+        Fade, ///< by opacity; a popup grows a little besides
+        Slide ///< a screen from the side, a popup from above
     };
     Q_ENUM(Effect)
 
@@ -46,6 +46,8 @@ public:
 
     /** The published target unless another one is set. Not owned. */
     QuickViewStateTarget *target() const;
+
+    /** Null shows nothing. What was shown for the former target goes. */
     void setTarget(QuickViewStateTarget *target);
 
     /**
@@ -59,7 +61,11 @@ public:
 
     /** In milliseconds; 250 unless set, 0 for none. */
     int duration() const;
+
+    /** OutCubic unless set. */
     QEasingCurve easing() const;
+
+    /** Slide for screens and Fade for popups unless set. */
     Effect effect() const;
 
     /**
@@ -78,13 +84,19 @@ Q_SIGNALS:
     void errorComponentChanged();
 
 protected:
+    /** For ScreenHost and PopupHost, with the effect that they have at first. */
     SceneHost(Effect effect, QQuickItem *parent);
 
+    /** Takes the published target when none is set, and begins to show it. */
     void componentComplete() override;
+
+    /** Gives all items the new size. */
     void geometryChanged(const QRectF &newGeometry, const QRectF &oldGeometry) override;
 
-    /** Begins or ends to show what @p target says. */
+    /** Begins to show what @p target says. */
     virtual void attach(QuickViewStateTarget *target) = 0;
+
+    /** Does not show any more what @p target says. */
     virtual void detach(QuickViewStateTarget *target) = 0;
 
     /** Lets go of all items, because the target to which they belong is not shown any more. */

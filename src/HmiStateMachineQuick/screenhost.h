@@ -36,9 +36,11 @@ class HMISTATEMACHINEQUICK_EXPORT ScreenHost : public SceneHost, public ViewPres
     Q_PROPERTY(QQuickItem *currentItem READ currentItem NOTIFY currentItemChanged)
 
 public:
+    /** Made by QML. Its effect is Slide at first. */
     explicit ScreenHost(QQuickItem *parent = nullptr);
     ~ScreenHost() override;
 
+    /** Called by QML for ScreenHost.position; owned by @p object. */
     static HostAttached *qmlAttachedProperties(QObject *object);
 
     /**
@@ -46,6 +48,8 @@ public:
      * left longest ago is dropped first. 0, at first, drops every screen; -1 keeps all.
      */
     int keep() const;
+
+    /** Drops at once what is too many. */
     void setKeep(int number);
 
     /** The screen that is shown or moves in; null before the first one. */
@@ -59,8 +63,12 @@ Q_SIGNALS:
     void currentItemChanged();
 
 protected:
+    /** Becomes the view presenter, and presents the view that is active already. */
     void attach(QuickViewStateTarget *target) override;
+
+    /** Withdraws as the view presenter. */
     void detach(QuickViewStateTarget *target) override;
+
     void clear() override;
     HostedComponent *declaredComponent(const QString &id) const override;
 

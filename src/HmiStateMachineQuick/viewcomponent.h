@@ -23,9 +23,11 @@ class HMISTATEMACHINEQUICK_EXPORT ViewComponent : public HostedComponent
     Q_PROPERTY(QString viewId MEMBER m_viewId NOTIFY viewIdChanged)
 
 public:
+    /** Made by QML, as a child of a ScreenHost. */
     explicit ViewComponent(QObject *parent = nullptr);
     ~ViewComponent() override;
 
+    /** The target view for which the component is. */
     QString viewId() const;
 
 Q_SIGNALS:

@@ -21,7 +21,10 @@ public:
     /** The name of the popup, or a dismiss identifier. */
     QString target() const { return m_target; }
 
-    /** Whether an interrupted popup returns; such a request is never refused. */
+    /**
+     * Whether an interrupted popup returns, which neither the popup in front nor the domain
+     * refuses.
+     */
     bool isReactivation() const { return m_reactivation; }
 
     /** What the request carries; invalid for nothing. */

@@ -54,7 +54,10 @@ public:
     /** Tells that a view is being left; the map has "exitReason" in any case. */
     virtual void deactivateView(const QString &viewId, const QVariant &instanceData) = 0;
 
-    /** Announces a popup before it is shown; @p reactivation when it had been interrupted. */
+    /**
+     * Announces a popup before it is shown. @p reactivation is true when it returns although a
+     * request for it would have been refused.
+     */
     virtual void preparePopup(const QString &popupId, bool reactivation) = 0;
 
     /**

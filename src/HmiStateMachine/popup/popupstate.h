@@ -24,12 +24,12 @@ class PopupRootState;
  * One popup, which lives in the popup layer of a PopupRootState and is requested by a PopupEvent of
  * its name.
  *
- * It belongs to its root. On entry it becomes the popup in front and asks the view layer to show
- * its popup view, unless the active domain blocks it; while it is entered, a change of the active
- * domain or view hides it, or shows it again. On exit it is hidden, or put on the popup stack. It
- * is left by a dismiss event (see PopupDismissTransition), by its timeout, by a driver restriction,
- * or because another popup interrupts it; whether it may be interrupted, and whether it comes back,
- * the PopupInterruptionStore says.
+ * It belongs to its root, when it has one. On entry it becomes the popup in front and asks the view
+ * layer to show its popup view, unless the active domain blocks it; while it is entered, a change
+ * of the active domain or view hides it, or shows it again. On exit it is hidden, or put on the
+ * popup stack. It is left by a dismiss event (see PopupDismissTransition), by its timeout, by a
+ * driver restriction, or because another popup interrupts it; whether it may be interrupted, and
+ * whether it comes back, the PopupInterruptionStore says.
  *
  * Belongs to the thread of the machine.
  */
@@ -131,8 +131,7 @@ public:
     int autoDismissRemainingTime() const;
 
     /**
-     * What the end of the time fires; null before auto-dismiss is first switched on, and without a
-     * root.
+     * What the end of the time fires; null until auto-dismiss is switched on and there is a root.
      */
     HmiSignalTransition *autoDismissTransition() const;
 
@@ -155,10 +154,13 @@ public:
     /** Closes the popup when that property takes that value; nothing while it is incomplete. */
     void setDriverRestricted(bool on);
 
-    /** Off at first, and while the property was incomplete when it was switched on. */
+    /** Whether it is closed so; false also when the property was incomplete. */
     bool driverRestricted() const;
 
-    /** Adds to the map that the view layer is given, from the next time the popup is shown on. */
+    /**
+     * Adds to the map that the view layer is given, from the next time on that the popup is shown
+     * or has new data.
+     */
     void addInstanceData(const QString &key, const QVariant &value);
 
     /** A key that is not there is ignored. */
@@ -235,8 +237,8 @@ Q_SIGNALS:
     void alreadyActivated();
 
     /**
-     * A request was refused, and has been kept or looked after. A popup that returns is never
-     * refused, and a request that a stacked popup prohibits is dropped without this.
+     * A request was refused; emitted after it was kept or looked after, if it was. A request that a
+     * stacked popup prohibits is dropped without this.
      */
     void blocked();
 
@@ -244,8 +246,9 @@ Q_SIGNALS:
     void exitingDueToDriverRestrictions();
 
     /**
-     * The view layer has reported it hidden. Emitted while reports are followed; see
-     * setReportsQmlPopupStatus(). A popup that has ever dismissed itself follows them too.
+     * The view layer has reported it hidden. Emitted while reports are followed: see
+     * setReportsQmlPopupStatus(). Once its auto-dismiss has been switched on, a popup always
+     * follows them.
      */
     void popupHidden();
 
@@ -300,8 +303,8 @@ public:
     virtual InterruptionBehavior interruption(PopupState *requested) const;
 
     /**
-     * Announces the popup to the view layer and emits aboutToBeActivated(); @p reactivation when it
-     * returns although it would have been refused.
+     * Announces the popup to the view layer and emits aboutToBeActivated(). @p reactivation is true
+     * when it returns although a request for it would have been refused.
      */
     virtual void prepareForActivation(bool reactivation);
 

@@ -16,7 +16,8 @@ class PopupState;
  * the child that is active.
  *
  * The popup in front of the whole system, of whichever layer, rules over the request; so do those
- * that the view layer keeps stacked, and the active domain. A popup that returns is never refused.
+ * that the view layer keeps stacked, and the active domain. A popup that returns is
+ * refused by neither the popup in front nor the domain, but one that is stacked may prohibit it.
  */
 class HMISTATEMACHINE_EXPORT PopupTransition : public QAbstractTransition
 {
