@@ -20,12 +20,15 @@ GROUPS = {
 }
 END_OF_COMMENT = re.compile(r"( |/\*\* .*)\*/")  # of one that is not indented: a class, a function
 DESTRUCTOR = re.compile(r"    (virtual )?~\w+\(\)( override)?;")
+COMMENT = re.compile(r" */?\*")
 PROPERTY = re.compile(r"    Q_PROPERTY\((?P<rest>.*)")
 NOTIFIER = re.compile(r"    void (?P<name>\w+Changed)\(.*\);")
 HEADING = re.compile(r"(#{1,6}) +(.+?)\s*$")
+CLASS = re.compile(r"^(?:class|struct) HMISTATEMACHINE(?:QUICK)?_EXPORT (\w+)", re.MULTILINE)
+QT_ALONE = re.compile(r"(?<![\w:%/(])Qt(?![\w:])")  # the product, not the namespace
 LINK = re.compile(r"(?<!!)\[([^\]]+)\]\((?![a-z]+:)([^)\s]+)\)")
 IMAGE = re.compile(r"!\[([^\]]*)\]\((?![a-z]+:)([^)\s]+)\)")
-CODE_SPAN = re.compile(r"(`[^`]*`)")
+LINK_OR_CODE = re.compile(r"(\[[^\]]*\]\([^)]*\)|`[^`]*`)")
 
 
 def properties(lines):
@@ -44,13 +47,13 @@ def property_comment(words):
         return words[words.index(keyword) + 1] if keyword in words else ""
 
     reader = after("READ") or words[words.index("MEMBER") - 1]
-    ways = [f"read by {reader}()"]
+    ways = [f"Read by {reader}()"]
     if after("WRITE"):
         ways.append(f"written by {after('WRITE')}()")
     elif "MEMBER" in words:
         ways.append("written by QML or setProperty()")
     ways.append(f"announced by {after('NOTIFY')}()" if after("NOTIFY") else "always the same")
-    return f"/** A property: {', '.join(ways)}. */"
+    return f"/** {', '.join(ways)}. */"
 
 
 def is_commented(result):
@@ -79,7 +82,7 @@ def header(path, lines):
             line = f"/** The property {names} has changed, and is stored by now. */ {line}"
         elif DESTRUCTOR.fullmatch(line):
             line = ""
-        result.append(line)
+        result.append(QT_ALONE.sub("%Qt", line) if COMMENT.match(line) else line)
     return result
 
 
@@ -98,16 +101,18 @@ def heading_label(path, anchor):
 
 
 def reference(path, match):
-    text, link = match.groups()
+    link = match[2]
+    text = re.sub(r"\s+", " ", match[1].replace("`", ""))  # a reference shows them as they are
+    rest = "\n" * match[1].count("\n")
     file_name, _, anchor = link.partition("#")
     target = (path.parent / file_name).resolve() if file_name else path
     if target.parent == ROOT / "docs" and target.suffix == ".md":
         label = heading_label(target, anchor) if anchor else page_label(target)
-        return f"[{text}](@ref {label})"
+        return f"[{text}](@ref {label}){rest}"
     if target.exists():
         # No part of the reference: named, not linked.
         name = target.relative_to(ROOT).as_posix()
-        return text if name in text else f"{text} (`{name}`)"
+        return match[1] if name in text else f"{match[1]} (`{name}`)"
     return f"[{text}](@ref missing_file__{re.sub(r'[^A-Za-z0-9]', '_', link)})"
 
 
@@ -117,27 +122,52 @@ def image(path, match):
     return f"![{text}]({name})"
 
 
-def prose(path, line):
-    """Links and images of a line; a link's text may itself be code."""
-    line = IMAGE.sub(lambda match: image(path, match), line)
-    return LINK.sub(lambda match: reference(path, match), line)
+def public_classes():
+    headers = (header for folder in GROUPS for header in (ROOT / folder).glob("*.h"))
+    return {name for header in headers for name in CLASS.findall(header.read_text(encoding="utf-8"))}
+
+
+def words(text, classes):
+    """A class that is named in code becomes a link; the word Qt does not."""
+    pieces = LINK_OR_CODE.split(text)
+    for index, piece in enumerate(pieces):
+        name = piece.strip("`")
+        if name != piece and name in classes:
+            pieces[index] = f"[{name}](@ref HmiStateMachine::{name})"
+        elif index % 2 == 0:
+            pieces[index] = QT_ALONE.sub("%Qt", piece)
+    return "".join(pieces)
+
+
+def prose(path, text, classes):
+    text = IMAGE.sub(lambda match: image(path, match), text)
+    return words(LINK.sub(lambda match: reference(path, match), text), classes)
+
+
+def labelled(path, heading):
+    """A heading with its anchor."""
+    marks, text = heading.groups()
+    label = page_label(path) if len(marks) == 1 else heading_label(path, slug(text))
+    return f"{marks} {text} {{#{label}}}"
 
 
 def page(path, lines):
     result = []
+    block = []  # lines of prose together, because a link may go on in the next one
+    classes = public_classes()
     fenced = False
-    for line in lines:
-        if line.lstrip().startswith("```"):
-            fenced = not fenced
-        heading = None if fenced else HEADING.fullmatch(line)
-        if heading and len(heading[1]) == 1:
-            line = f"# {heading[2]} {{#{page_label(path)}}}"
-        elif heading:
-            line = f"{heading[1]} {heading[2]} {{#{heading_label(path, slug(heading[2]))}}}"
-        elif not fenced:
-            line = prose(path, line)
-        result.append(line)
-    return result
+    for line in lines + [""]:
+        fence = line.lstrip().startswith("```")
+        heading = None if fenced or "{#" in line else HEADING.fullmatch(line)
+        if line and not (fenced or fence or heading):
+            block.append(line)
+            continue
+        if block:
+            result.append(prose(path, "\n".join(block), classes))
+            block = []
+        fenced = fenced != fence
+        result.append(labelled(path, heading) if heading else line)
+    return result[:-1]
 
 
 def main():
@@ -145,7 +175,7 @@ def main():
     lines = path.read_text(encoding="utf-8").split("\n")
     if path.suffix == ".h":
         lines = header(path, lines)
-    elif path.parent == ROOT / "docs":
+    else:
         lines = page(path, lines)
     sys.stdout.write("\n".join(lines))
 
