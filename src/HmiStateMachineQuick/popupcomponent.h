@@ -11,7 +11,7 @@ namespace HmiStateMachine {
  * Names a component for popups inside a PopupHost: for the one popup with that popup view id, or
  * for all of a kind that have none of their own.
  *
- * @code
+ * @code{.qml}
  * PopupHost {
  *     PopupComponent { popupId: "FuelWarning"; source: "popups/Fuel.qml" }
  *     PopupComponent { kind: 4; WarningPopup { } }

@@ -23,7 +23,7 @@ class PopupListModel;
  * visible part itself; those of the properties "popupId", "popupKind", "popupData", "remainingTime"
  * and "totalTime" (milliseconds) that it declares are kept up to date.
  *
- * @code
+ * @code{.qml}
  * PopupHost {
  *     anchors.fill: parent
  *     PopupComponent { popupId: "FuelWarning"; source: "popups/Fuel.qml" }

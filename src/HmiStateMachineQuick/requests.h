@@ -16,7 +16,7 @@ namespace HmiStateMachine {
  * ScreenHost; the request goes to the flow all the same, which decides. Owned by its
  * QuickViewStateTarget.
  *
- * @code
+ * @code{.qml}
  * TapHandler { onTapped: Requests.view("Media/Player", { track: 7 }) }
  * @endcode
  */

@@ -21,7 +21,7 @@ class HostAttached;
  * takes no input. Forwards, screens come in from the right; a back press brings them in from the
  * left.
  *
- * @code
+ * @code{.qml}
  * ScreenHost {
  *     anchors.fill: parent
  *     source: "views/%1.qml"     // the view "Media/Player" is views/Media/Player.qml

@@ -10,7 +10,7 @@ namespace HmiStateMachine {
 /**
  * Names the component of one view inside a ScreenHost, in place of the host's source pattern.
  *
- * @code
+ * @code{.qml}
  * ScreenHost {
  *     ViewComponent { viewId: "Home"; HomeScreen { } }
  *     ViewComponent { viewId: "Radio"; source: "screens/Tuner.qml" }

@@ -13,7 +13,14 @@ class GuardedTransition;
  *
  * A receiver forbids by setAllowTransition(false) on the state's GuardedTransition, which it finds
  * with findChild(). Each test is written to the log. Without a target the state is not left, with
- * one warning.
+ * one warning. A receiver may also choose the target.
+ *
+ * @code
+ * auto *decision = new HmiConditionalState("MapOrDisclaimer", machine);
+ * QObject::connect(decision, &HmiConditionalState::conditionTest, decision, [decision, accepted] {
+ *     decision->setNamedTargetState(accepted() ? "Map" : "Disclaimer");
+ * });
+ * @endcode
  */
 class HMISTATEMACHINE_EXPORT HmiConditionalState : public HmiState
 {

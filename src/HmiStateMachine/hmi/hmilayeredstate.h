@@ -16,6 +16,12 @@ class PopupRootState;
  *
  * It makes and owns both layers, which are entered and left with it. Leaving it hides its popups,
  * and none of them returns.
+ *
+ * @code
+ * auto *screens = new HmiLayeredState("Screens", machine);
+ * screens->setInitialHmiState(new HmiViewState("Home", screens));
+ * new PopupState("phone/call", screens, 1);    // 1: a kind that the view layer knows
+ * @endcode
  */
 class HMISTATEMACHINE_EXPORT HmiLayeredState : public HmiState
 {

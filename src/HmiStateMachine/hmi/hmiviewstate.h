@@ -32,7 +32,7 @@ class HmiViewTransition;
  * of the view that was left last.
  *
  * @code
- * auto *home = new HmiViewState("Home", machine);
+ * new HmiViewState("Home", machine);
  * auto *radio = new HmiViewState("Radio", machine);
  * radio->setHandlesBackEvent(true);                             // back leads to where we came from
  * machine->postEvent(new HmiViewEvent("Radio", QVariant()));    // from any view

@@ -18,6 +18,14 @@ namespace HmiStateMachine {
  * Qt offers every newly entered configuration an event of type QEvent::None first: a guard that
  * allows it lets the transition fire as soon as its source is entered. Without a target it is not
  * taken on such an event, with one warning, because it would be taken for ever.
+ *
+ * @code
+ * auto *leave = new GuardedTransition(menu);
+ * leave->setTargetState(home);
+ * QObject::connect(leave, &GuardedTransition::transitionTest, leave, [leave](QEvent *event) {
+ *     leave->setAllowTransition(event->type() == QEvent::User);
+ * });
+ * @endcode
  */
 class HMISTATEMACHINE_EXPORT GuardedTransition : public QAbstractTransition,
                                                  public NamedTargetTransitionBase

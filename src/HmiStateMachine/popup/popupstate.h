@@ -32,6 +32,13 @@ class PopupRootState;
  * whether it comes back, the PopupInterruptionStore says.
  *
  * Belongs to the thread of the machine.
+ *
+ * @code
+ * auto *fuel = new PopupState("car/fuel", layer, 4);    // 4: a kind that the view layer knows
+ * fuel->setAutoDismissTimeoutActive(true);              // after five seconds on the screen
+ * machine->postEvent(new PopupEvent("car/fuel", 42));
+ * machine->postEvent(new PopupEvent(fuel->dismissEventIdentifier(), QVariant()));
+ * @endcode
  */
 class HMISTATEMACHINE_EXPORT PopupState : public NamedState
 {
