@@ -82,3 +82,7 @@ xvfb_packages=(xvfb xauth)
 # What the benchmarks need beside that, and so the preset "release". Qt SCXML's CMake files ask for
 # Qt Qml, which its own package does not bring.
 benchmark_packages=(libqt5scxml5-dev qtdeclarative5-dev valgrind)
+
+# What the reference of the classes needs, and so the preset "dev": Doxygen, graphviz for its drawings,
+# Qt's tag files for links to Qt's own reference.
+docs_packages=(doxygen graphviz python3 qtbase5-doc-dev qtdeclarative5-doc-dev)
