@@ -8,12 +8,6 @@ namespace {
 
 QString describe(const QMetaMethod &method)
 {
-    QStringList parameters;
-    const auto types = method.parameterTypes();
-    const auto names = method.parameterNames();
-    for (int i = 0; i < types.size(); ++i) {
-        parameters.append(QString::fromLatin1(types.at(i) + ' ' + names.at(i)).trimmed());
-    }
     QString kind = "method ";
     if (method.methodType() == QMetaMethod::Signal) {
         kind = "signal ";
@@ -23,7 +17,7 @@ QString describe(const QMetaMethod &method)
     if (method.methodType() == QMetaMethod::Slot && method.access() == QMetaMethod::Private) {
         kind.prepend("private ");
     }
-    return kind + method.name() + '(' + parameters.join(", ") + ')';
+    return kind + method.name() + '(' + parameterList(method) + ')';
 }
 
 QString describe(const QMetaProperty &property)
@@ -42,6 +36,17 @@ QString describe(const QMetaProperty &property)
 }
 
 } // namespace
+
+QString parameterList(const QMetaMethod &method)
+{
+    QStringList parameters;
+    const auto types = method.parameterTypes();
+    const auto names = method.parameterNames();
+    for (int i = 0; i < types.size(); ++i) {
+        parameters.append(QString::fromLatin1(types.at(i) + ' ' + names.at(i)).trimmed());
+    }
+    return parameters.join(", ");
+}
 
 QStringList metaDescription(const QMetaObject &meta)
 {

@@ -3,6 +3,11 @@
 #include <QMetaObject>
 #include <QStringList>
 
+class QMetaMethod;
+
+/** "QString oldViewId, QString newViewId": types as they are written, and names. */
+QString parameterList(const QMetaMethod &method);
+
 /**
  * What a class itself adds to its meta-object, in order, one line an entry:
  *
