@@ -86,3 +86,6 @@ benchmark_packages=(libqt5scxml5-dev qtdeclarative5-dev valgrind)
 # What the reference of the classes needs, and so the preset "dev": Doxygen, graphviz for its drawings,
 # Qt's tag files for links to Qt's own reference.
 docs_packages=(doxygen graphviz python3 qtbase5-doc-dev qtdeclarative5-doc-dev)
+
+# What compares the binary interface with the committed one, and so the preset "dev".
+interface_packages=(abigail-tools python3)

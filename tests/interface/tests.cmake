@@ -1,9 +1,6 @@
 # The interface as it was last committed: HmiStateMachine*.metaobjects and HmiStateMachine*.abi beside
 # this file. "update-interface" renews them.
 
-find_program(HMI_TEST_PYTHON NAMES python3 PATHS /usr/bin NO_DEFAULT_PATH)
-find_program(HMI_TEST_PYTHON NAMES python3 REQUIRED)
-
 set(folder ${CMAKE_CURRENT_LIST_DIR})
 set(HMI_INTERFACE_LIBRARIES HmiStateMachine)
 set(HMI_INTERFACE_HEADERS_OF_HmiStateMachine ${HMISTATEMACHINE_PUBLIC_HEADERS})
@@ -54,7 +51,10 @@ endforeach()
 # What abidw reads out of debug information differs by compiler, optimisation and processor: the
 # dump is of a debug build by GCC for x86-64.
 if(CMAKE_CXX_COMPILER_ID STREQUAL "GNU" AND CMAKE_BUILD_TYPE STREQUAL "Debug" AND BUILD_SHARED_LIBS
-        AND CMAKE_SYSTEM_PROCESSOR STREQUAL "x86_64" AND NOT HMISTATEMACHINE_SANITIZE)
+        AND CMAKE_SYSTEM_PROCESSOR STREQUAL "x86_64" AND NOT HMISTATEMACHINE_SANITIZE
+        AND HMISTATEMACHINE_TEST_PACKAGE)
+    find_program(HMI_TEST_PYTHON NAMES python3 PATHS /usr/bin NO_DEFAULT_PATH)
+    find_program(HMI_TEST_PYTHON NAMES python3 REQUIRED)
     find_program(HMI_TEST_ABIDW NAMES abidw REQUIRED)
     find_program(HMI_TEST_ABIDIFF NAMES abidiff REQUIRED)
     set(abi ${HMI_TEST_PYTHON} -B ${folder}/abi/abi.py)
@@ -74,5 +74,5 @@ if(CMAKE_CXX_COMPILER_ID STREQUAL "GNU" AND CMAKE_BUILD_TYPE STREQUAL "Debug" AN
     add_custom_target(update-interface ${HMI_INTERFACE_UPDATES} VERBATIM)
 else()
     message(STATUS "Tests of the ABI: off (they are for a debug build of the shared library by GCC "
-        "on x86-64, without sanitizers)")
+        "on x86-64 without sanitizers, with HMISTATEMACHINE_TEST_PACKAGE)")
 endif()

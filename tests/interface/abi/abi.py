@@ -14,7 +14,7 @@ from pathlib import Path
 
 from reduce import reduce_file
 
-ABIDW = ["abidw", "--no-corpus-path", "--no-comp-dir-path", "--no-elf-needed", "--no-parameter-names",
+ABIDW = ["abidw", "--exported-interfaces-only", "--no-corpus-path", "--no-comp-dir-path", "--no-elf-needed", "--no-parameter-names",
          "--type-id-style", "hash"]
 ABIDIFF = ["abidiff", "--no-show-locs"]
 

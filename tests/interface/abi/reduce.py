@@ -61,7 +61,7 @@ class Type:
     def contents(self):
         if self.element.tag not in CLASSES:
             return list(self.element)
-        return sorted(self.members.values(), key=place_of) # data members stay in their order
+        return sorted(self.members.values(), key=place_of)  # data members stay in their order
 
 
 class Reduction:
@@ -95,7 +95,8 @@ class Reduction:
 
     def reach(self):
         """Reduces the public types, and all that they refer to."""
-        waiting = [key for key, known in self.types.items() if self.is_public(known)]
+        waiting = [key for key, known in self.types.items()
+                   if self.is_public(known) and not known.element.get("is-anonymous")]
         while waiting:
             key = waiting.pop()
             if key in self.reduced:

@@ -1,0 +1,7 @@
+# QNX 7 on 64-bit x86. UNTESTED HERE: written from QNX's and CMake's documentation; nothing has been
+# built with it, because the project's own machines have no QNX SDK. See docs/porting.md.
+
+set(CMAKE_SYSTEM_PROCESSOR x86_64)
+set(HMI_QNX_VARIANT gcc_ntox86_64)
+set(HMI_QNX_TARGET_FOLDER x86_64)
+include(${CMAKE_CURRENT_LIST_DIR}/qnx7.cmake)
