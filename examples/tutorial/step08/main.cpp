@@ -1,0 +1,64 @@
+#include "hardkeys.h"
+#include "printing.h"
+
+#include <HmiStateMachine/hmi/hmilayeredstate.h>
+#include <HmiStateMachine/hmi/hmiviewstate.h>
+#include <HmiStateMachine/named/hmiviewevent.h>
+#include <HmiStateMachine/named/keysignaltransition.h>
+#include <HmiStateMachine/named/popupevent.h>
+#include <HmiStateMachine/popup/popupinterruptionstore.h>
+#include <HmiStateMachine/popup/popupstate.h>
+
+#include <QLoggingCategory>
+
+using namespace HmiStateMachine;
+
+static void buildFlow(HardKeys *keys)
+{
+    StateMachine *machine = StateMachine::instance();
+    auto *screens = new HmiLayeredState("Screens", machine);
+    machine->setInitialState(screens);
+    auto *home = new HmiViewState("Home", screens);
+    screens->setInitialHmiState(home);
+    (new HmiViewState("Radio", screens))->setHandlesBackEvent(true);
+    (new HmiViewState("Stations", screens))->setHandlesBackEvent(true);
+    (new HmiViewState("Settings", screens))->createDirectBackTransition(home);
+
+    auto *volume = new PopupState("audio/volume", screens, 0);
+    volume->setAutoDismissTimeoutInterval(3000);
+    volume->setAutoDismissTimeoutActive(true);
+    new PopupState("phone/call", screens, 0);
+    PopupInterruptionStore::instance()->loadInterruptionBehaviors(RULES_FILE);
+
+    auto *homeKey = new KeySignalTransition(keys, SIGNAL(changed(int, int)), HardKeys::Home,
+                                            HardKeys::Pressed, screens);
+    QObject::connect(homeKey, &KeySignalTransition::keyTransitionTriggered, machine,
+                     [machine] { machine->postEvent(new HmiViewEvent("Home", QVariant())); });
+    auto *louderKey = new KeySignalTransition(keys, SIGNAL(changed(int, int)), HardKeys::Louder,
+                                              HardKeys::Pressed, screens);
+    QObject::connect(louderKey, &KeySignalTransition::keyTransitionTriggered, machine,
+                     [machine] { machine->postEvent(new PopupEvent("audio/volume", 12)); });
+}
+
+static void press(HardKeys *keys, const QString &text, HardKeys::Key key)
+{
+    say(text);
+    keys->press(key);
+    QCoreApplication::sendPostedEvents();
+}
+
+int main(int argc, char *argv[])
+{
+    QCoreApplication app(argc, argv);
+    QLoggingCategory::setFilterRules("*.debug=false");
+    PrintingViewLayer viewLayer;
+    HardKeys keys;
+    buildFlow(&keys);
+    StateMachine::instance()->start();
+    QCoreApplication::sendPostedEvents();
+
+    request("The radio.", new HmiViewEvent("Radio", "Bay Jazz"));
+    press(&keys, "The home key.", HardKeys::Home);
+    press(&keys, "The home key again.", HardKeys::Home);
+    press(&keys, "The key for louder.", HardKeys::Louder);
+}
