@@ -1,7 +1,9 @@
-# cmake -DEXPECTED=.. -DEXIT_CODE=.. -DSTREAM=.. -DACTUAL=.. -P CompareOutput.cmake -- <command>...
+# cmake -DEXPECTED=.. -DEXIT_CODE=.. -DSTREAM=.. [-DLINES=..] -DACTUAL=.. -P CompareOutput.cmake
+#       -- <command>...
 #
 # Fails when the command's output on STREAM is not the text of EXPECTED, when its exit code is not
-# EXIT_CODE, or when it succeeds and yet writes to stderr, unless that is what is compared.
+# EXIT_CODE, or when it succeeds and yet writes to stderr, unless that is what is compared. With the
+# regular expression LINES, only such lines of STREAM count, and nothing else.
 
 set(command "")
 set(found_separator FALSE)
@@ -19,6 +21,12 @@ execute_process(COMMAND ${command}
     ERROR_VARIABLE stderr
     RESULT_VARIABLE exit_code)
 file(READ ${EXPECTED} expected)
+if(LINES)
+    string(REGEX MATCHALL "[^\n]*\n" all "${${STREAM}}")
+    list(FILTER all INCLUDE REGEX "${LINES}")
+    list(JOIN all "" ${STREAM})
+    set(stderr "")
+endif()
 
 if(NOT "${${STREAM}}" STREQUAL "${expected}")
     file(WRITE ${ACTUAL} "${${STREAM}}")

@@ -1,6 +1,7 @@
-# cmake -DBUILD_DIR=.. -DEXAMPLE_DIR=.. -DWORK_DIR=.. -DCXX_COMPILER=.. -P alone.cmake
+# cmake -DBUILD_DIR=.. -DEXAMPLE_DIR=.. -DPROGRAM=.. -DWORK_DIR=.. -DCXX_COMPILER=.. -P alone.cmake
 #
-# Installs BUILD_DIR below WORK_DIR, which is made anew, and builds the example against that.
+# Installs BUILD_DIR below WORK_DIR, which is made anew, and builds the example against that,
+# the program of that name among it.
 
 cmake_minimum_required(VERSION 3.22)
 
@@ -19,6 +20,6 @@ run(${CMAKE_COMMAND} -G Ninja -S ${EXAMPLE_DIR} -B ${WORK_DIR}/build
     -DCMAKE_BUILD_TYPE=Debug -DCMAKE_CXX_COMPILER=${CXX_COMPILER}
     -DCMAKE_PREFIX_PATH=${WORK_DIR}/prefix)
 run(${CMAKE_COMMAND} --build ${WORK_DIR}/build)
-if(NOT EXISTS ${WORK_DIR}/build/quickstart-qml)
+if(NOT EXISTS ${WORK_DIR}/build/${PROGRAM})
     message(FATAL_ERROR "There is no program")
 endif()

@@ -1,7 +1,8 @@
 # cmake -DPAGE=.. -DEXAMPLE_DIR=.. -P docs.cmake
 #
-# Fails when a cpp, qml or cmake block of the page is not found, line by line, in a file of the
-# example. Only how far the lines are indented may differ.
+# Fails when a cpp, qml, cmake, json or text block of the page is not found, line by line, in a file
+# of the example, which may lie in several folders. Only how far the lines are indented may differ.
+# What a text block shows is the output that a test compares with *.expected.
 
 cmake_minimum_required(VERSION 3.22)
 
@@ -10,8 +11,12 @@ function(without_indentation text result)
     set(${result} "${text}" PARENT_SCOPE)
 endfunction()
 
-file(GLOB_RECURSE files ${EXAMPLE_DIR}/*.cpp ${EXAMPLE_DIR}/*.h ${EXAMPLE_DIR}/*.qml
-    ${EXAMPLE_DIR}/CMakeLists.txt)
+set(files "")
+foreach(folder IN LISTS EXAMPLE_DIR)
+    file(GLOB_RECURSE found ${folder}/*.cpp ${folder}/*.h ${folder}/*.qml ${folder}/*.json
+        ${folder}/*.expected ${folder}/CMakeLists.txt)
+    list(APPEND files ${found})
+endforeach()
 set(sources "")
 foreach(file IN LISTS files)
     file(READ ${file} text)
@@ -39,7 +44,7 @@ while(TRUE)
     string(SUBSTRING "${rest}" 0 ${end} block)
     math(EXPR end "${end} + 4")
     string(SUBSTRING "${rest}" ${end} -1 rest)
-    if(language MATCHES "^(cpp|qml|cmake)$")
+    if(language MATCHES "^(cpp|qml|cmake|json|text)$")
         math(EXPR checked "${checked} + 1")
         without_indentation("${block}" wanted)
         string(FIND "${sources}" "${wanted}" place)

@@ -31,6 +31,7 @@ if(HMISTATEMACHINE_TEST_PACKAGE)
     add_test(NAME quickstart-qml-alone COMMAND ${CMAKE_COMMAND}
         -D BUILD_DIR=${PROJECT_BINARY_DIR}
         -D EXAMPLE_DIR=${quickstart_dir}
+        -D PROGRAM=quickstart-qml
         -D WORK_DIR=${CMAKE_CURRENT_BINARY_DIR}/quickstart-alone
         -D CXX_COMPILER=${CMAKE_CXX_COMPILER}
         -P ${CMAKE_CURRENT_LIST_DIR}/alone.cmake)

@@ -1,0 +1,7 @@
+set(recipes_dir ${PROJECT_SOURCE_DIR}/examples/recipes)
+file(GLOB outputs CONFIGURE_DEPENDS ${recipes_dir}/*.expected)
+foreach(output IN LISTS outputs)
+    get_filename_component(recipe ${output} NAME_WE)
+    hmi_add_guide_output(recipe-${recipe} ${output} recipes ${recipe})
+endforeach()
+hmi_add_guide_page(recipes ${recipes_dir} ${PROJECT_SOURCE_DIR}/examples/tutorial/step10)
