@@ -16,7 +16,7 @@ BLOCK = re.compile(r"^```(\w+)\n(.*?)^```$", re.MULTILINE | re.DOTALL)
 def code_lines(text):
     """The lines that count; which header a class needs its name tells."""
     lines = (line.strip() for line in text.splitlines())
-    return [line for line in lines if len(line) > 1 and not line.startswith("#include")]
+    return [line for line in lines if len(line) > 1 and not line.startswith("#")]
 
 
 def sections(page):

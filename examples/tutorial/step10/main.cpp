@@ -3,6 +3,7 @@
 #include "printing.h"
 
 #include <HmiStateMachine/named/hmievent.h>
+#include <HmiStateMachine/named/hmiviewevent.h>
 
 #include <QLoggingCategory>
 
@@ -22,4 +23,7 @@ int main(int argc, char *argv[])
     request("A film, on the way.", new HmiEvent("video", QVariant()));
     s_driving = false;
     request("A film, in the car park.", new HmiEvent("video", QVariant()));
+    request("Home.", new HmiViewEvent("Home", QVariant()));
+    s_driving = true;
+    request("The view of the film, on the way.", new HmiViewEvent("Video", QVariant()));
 }
