@@ -18,6 +18,7 @@ void driverRestriction()
     Vehicle vehicle;
     PopupState::setDriverRestrictionProperty(&vehicle, "moving", true);
     auto *screens = new HmiLayeredState("Screens", StateMachine::instance());
+    new PopupState("phone/call", screens, 0);
     auto *keyboard = new PopupState("input/keyboard", screens, 0);
     keyboard->setDriverRestricted(true); // after the property has been named
     QObject::connect(keyboard, &PopupState::exitingDueToDriverRestrictions, keyboard,
@@ -29,6 +30,11 @@ void driverRestriction()
     vehicle.setProperty("moving", true);
     QCoreApplication::sendPostedEvents();
     request("The keyboard, while it moves.", new PopupEvent("input/keyboard", QVariant()));
+
+    vehicle.setProperty("moving", false);
+    request("The car stands. A call interrupts.", new PopupEvent("phone/call", QVariant()));
+    vehicle.setProperty("moving", true);
+    request("The car moves, and the call ends.", new PopupEvent("phone/call_Dismiss", QVariant()));
 }
 
 namespace {

@@ -86,7 +86,9 @@ void dataAndRefresh()
 {
     PrintingViewLayer viewLayer;
     QObject::connect(&viewLayer, &ViewStateTarget::activeViewDataChanged, &viewLayer,
-                     [](const QVariant &data) { say("  refresh with: " + data.toString()); });
+                     [](const QVariant &data) {
+                         say("  refresh: " + (data.isValid() ? data.toString() : "nothing"));
+                     });
     StateMachine *machine = StateMachine::instance();
     auto *home = new HmiViewState("Home", machine);
     auto *radio = new HmiViewState("Radio", machine);

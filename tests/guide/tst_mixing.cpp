@@ -17,6 +17,9 @@
 #include <QTimerEvent>
 #include <QtTest>
 
+#include <type_traits>
+#include <utility>
+
 using namespace HmiStateMachine;
 
 namespace {
@@ -41,6 +44,29 @@ struct Flow
     }
 };
 
+// What of QState's ways to add a transition the class has kept.
+template <typename State, typename = void> struct TakesMemberPointer : std::false_type
+{
+};
+template <typename State>
+struct TakesMemberPointer<State,
+                          decltype(void(std::declval<State>().addTransition(
+                              std::declval<Emitter *>(), &Emitter::plain,
+                              std::declval<QState *>())))> : std::true_type
+{
+};
+template <typename State, typename = void> struct TakesTarget : std::false_type
+{
+};
+template <typename State>
+struct TakesTarget<State,
+                   decltype(void(std::declval<State>().addTransition(std::declval<QState *>())))>
+    : std::true_type
+{
+};
+static_assert(TakesMemberPointer<QState>() && TakesTarget<QState>(), "Qt has both");
+static_assert(!TakesMemberPointer<NamedState>() && !TakesTarget<NamedState>(), "do not compile");
+
 } // namespace
 
 /** What docs/from-qstatemachine.md says of Qt's states and transitions among the library's. */
@@ -54,6 +80,7 @@ private Q_SLOTS:
     void aRequestFindsNobodyWhileABareStateIsActive();
     void aBareStateTakesRequestsWithAViewTransition();
     void aBareStateIsNoBackTarget();
+    void viewsWorkBelowABareState();
     void bareStatesWorkBelowNamedOnes();
     void propertiesAreAssigned();
     void eventTransitionsAndFinalStatesStay();
@@ -119,6 +146,24 @@ void tst_Mixing::aBareStateIsNoBackTarget()
     flow.request("Radio");
 
     QCOMPARE(flow.radio->backTarget(), QString("Home"));
+}
+
+void tst_Mixing::viewsWorkBelowABareState()
+{
+    Flow flow;
+    auto *list = new HmiViewState("List", flow.old);
+    auto *details = new HmiViewState("Details", flow.old);
+    details->setHandlesBackEvent(true);
+    flow.old->setInitialState(list);
+    startIn(flow.machine, flow.old);
+
+    flow.request("Details");
+    flow.machine.postEvent(new HmiBackEvent(1, QString()));
+    settle();
+
+    QCOMPARE(flow.journal.lines(),
+             QStringList({"activateView List", "deactivateView List", "activateView Details",
+                          "deactivateView Details", "activateView List"}));
 }
 
 void tst_Mixing::bareStatesWorkBelowNamedOnes()
