@@ -1,0 +1,15 @@
+# The pages in docs tell the truth: in the preset that checks the package too.
+if(NOT HMISTATEMACHINE_TEST_PACKAGE)
+    message(STATUS "Tests of the pages in docs: off (HMISTATEMACHINE_TEST_PACKAGE)")
+    return()
+endif()
+
+find_program(HMI_TEST_PYTHON NAMES python3 PATHS /usr/bin NO_DEFAULT_PATH)
+find_program(HMI_TEST_PYTHON NAMES python3 REQUIRED)
+
+# Pages that name tests.
+set(behaviour_pages ${PROJECT_SOURCE_DIR}/docs/behaviour.md)
+add_test(NAME behaviour-names COMMAND ${HMI_TEST_PYTHON} -B
+    ${CMAKE_CURRENT_LIST_DIR}/testnames.py --programs $<TARGET_FILE_DIR:tst_namedstate>
+    ${behaviour_pages})
+set_tests_properties(behaviour-names PROPERTIES LABELS "docs;package" TIMEOUT 120)
