@@ -62,6 +62,7 @@ private Q_SLOTS:
     void aForbiddenInitialViewFallsBack();
     void fallbacksMayFollowOneAnother();
     void anEventForAViewThatIsLeftAlreadyIsDropped();
+    void aViewInAnotherMachineDoesNotFallBack();
 };
 
 void tst_HmiFallbackViewState::itsMetaObjectIsAsPublished()
@@ -348,6 +349,23 @@ void tst_HmiFallbackViewState::anEventForAViewThatIsLeftAlreadyIsDropped()
 
     QVERIFY(flow.fallback->isActive());
     QCOMPARE(flow.take(), QStringList({"deactivateView View", "activateView Fallback"}));
+}
+
+void tst_HmiFallbackViewState::aViewInAnotherMachineDoesNotFallBack()
+{
+    ViewFlow flow;
+    new ChoosyView("Choosy", "Fallback", &flow.machine);
+    flow.view("Fallback");
+    flow.start(flow.view("Home"));
+
+    // The process-wide machine is asked, which does not run here.
+    QTest::ignoreMessage(QtWarningMsg,
+                         "QStateMachine::postEvent: cannot post event when the state "
+                         "machine is not running");
+    flow.request("Choosy");
+
+    QCOMPARE(flow.take(), QStringList({"deactivateView Home"}));
+    QCOMPARE(flow.activeView(), QString("Choosy"));
 }
 
 QTEST_GUILESS_MAIN(tst_HmiFallbackViewState)

@@ -10,6 +10,7 @@
 #include <QtTest>
 
 #include <memory>
+#include <optional>
 #include <type_traits>
 
 using namespace HmiStateMachine;
@@ -57,6 +58,7 @@ private Q_SLOTS:
     void siblingGroupsGoBySenderAndSignal_data();
     void siblingGroupsGoBySenderAndSignal();
     void aDestroyedSiblingNoLongerTakesTheSignal();
+    void aSenderAtTheAddressOfAnEarlierOneFindsItsGroup();
 
     void itsTargetIsSetByName();
     void anUnknownTargetNameLeavesTheMachineWhereItIs();
@@ -382,6 +384,21 @@ void tst_HmiSignalTransition::aDestroyedSiblingNoLongerTakesTheSignal()
     Q_EMIT emitter.plain();
 
     QCOMPARE(fired.size(), 1);
+}
+
+void tst_HmiSignalTransition::aSenderAtTheAddressOfAnEarlierOneFindsItsGroup()
+{
+    std::optional<Emitter> sender;
+    TwoRegions regions;
+    sender.emplace();
+    HmiSignalTransition first(&*sender, "2plain()", regions.left);
+    QVERIFY(first.makeParallelExclusive(3));
+
+    sender.emplace();
+    HmiSignalTransition second(&*sender, "2plain()", regions.right);
+
+    QVERIFY(!second.makeParallelExclusive(3));
+    QVERIFY(second.makeParallelExclusive(4));
 }
 
 void tst_HmiSignalTransition::itsTargetIsSetByName()

@@ -16,6 +16,18 @@ namespace {
 
 using Filter = QSharedPointer<HmiTargetFilter>;
 
+/** Gives in when it is asked for the thousandth time. */
+struct ImpatientFilter : HmiTargetFilter
+{
+    bool isValid(const QString &target) const override
+    {
+        Q_UNUSED(target)
+        return ++asked == 1000;
+    }
+
+    mutable int asked = 0;
+};
+
 } // namespace
 
 /** How a view that is entered forwards finds its back target. */
@@ -47,6 +59,7 @@ private Q_SLOTS:
     void theWalkUsesTheFiltersOfTheEnteredView();
     void theWalkFindsViewsByWhatTheyShow();
     void aCircleEndsAtTheFirstAcceptedView();
+    void aCircleIsWalkedAsLongAsTheFiltersRefuse();
     void theEndOfTheWalkIsLogged();
     void anUnknownTargetOnTheWalkIsLogged();
     void aRefusedStateThatIsNoViewEndsTheWalk();
@@ -427,6 +440,25 @@ void tst_HmiViewStateBackStack::aCircleEndsAtTheFirstAcceptedView()
 
     flow.request("Radio");
 
+    QCOMPARE(radio->backTarget(), QString("List"));
+}
+
+void tst_HmiViewStateBackStack::aCircleIsWalkedAsLongAsTheFiltersRefuse()
+{
+    ViewFlow flow;
+    HmiViewState *player = flow.backView("Player");
+    flow.backView("List");
+    HmiViewState *radio = flow.backView("Radio");
+    const auto patience = QSharedPointer<ImpatientFilter>::create();
+    radio->addBackTargetFilter(patience);
+    flow.start(player);
+    flow.request("List");
+    flow.request("Player");
+
+    flow.request("Radio");
+
+    // Nothing but the filter ends the walk.
+    QCOMPARE(patience->asked, 1000);
     QCOMPARE(radio->backTarget(), QString("List"));
 }
 

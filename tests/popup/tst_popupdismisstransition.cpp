@@ -41,6 +41,7 @@ private Q_SLOTS:
     void theTransitionLeadsFromTheActivePopupToNoPopup();
     void theTransitionOfAWaitingPopupHangsOnTheRoot();
     void aPopupThatCannotBeDismissedIgnoresItsEvents();
+    void theWildcardHidesAPopupThatCannotBeDismissed();
 };
 
 void tst_PopupDismissTransition::itsMetaObjectIsAsPublished()
@@ -330,6 +331,24 @@ void tst_PopupDismissTransition::aPopupThatCannotBeDismissedIgnoresItsEvents()
     flow.request("dismisscannot/fuel_Dismiss");
 
     QVERIFY(popup->isActive());
+}
+
+void tst_PopupDismissTransition::theWildcardHidesAPopupThatCannotBeDismissed()
+{
+    PopupFlow flow(messages());
+    PopupState *popup = flow.popup("dismisswild/fuel", "FuelView");
+    popup->dismissTransition()->setDismissTarget("");
+    flow.start();
+    flow.request("dismisswild/fuel");
+    flow.takeMessages();
+    flow.take();
+
+    flow.request("DismissAnyPopup");
+
+    // It stays in front, unseen.
+    QCOMPARE(flow.take(), QStringList({"requestPopupHide FuelView true", "unstackPopup FuelView"}));
+    QVERIFY(popup->isActive());
+    QCOMPARE(PopupState::getActivePopupState(), popup);
 }
 
 QTEST_GUILESS_MAIN(tst_PopupDismissTransition)

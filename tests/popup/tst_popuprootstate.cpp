@@ -51,8 +51,12 @@ private Q_SLOTS:
     void theResetTransitionMovesWithTheActiveChild();
     void resetIsHandledOnlyWithAPopup();
     void resetForgetsThoseThatWait();
+    void aResetTakesTheNameOfAStateForAView();
     void clearingWithoutAPopupOnlyForgets();
+    void clearingLeavesAStackedSiblingStacked();
     void aPopupRenamedWhileItWaitsDoesNotReturn();
+    void aPopupRenamedWhileItIsShownComesBackOnce();
+    void theNoPopupStateTakesItsOwnDismissal();
     void leavingTheLayerForgetsThoseThatWait();
     void handlingAResetWithoutAViewLayerForgetsAllTheSame();
     void aRootWithoutAMachineRequestsNothingAgain();
@@ -429,6 +433,26 @@ void tst_PopupRootState::resetForgetsThoseThatWait()
     QCOMPARE(flow.lower->activePopupState(), flow.lower->noPopupState());
 }
 
+void tst_PopupRootState::aResetTakesTheNameOfAStateForAView()
+{
+    PopupFlow flow(messages());
+    flow.popup("rootresetname/fuel", "FuelView");
+    flow.upperPopup("rootresetname/warn", "rootresetname/fuel");
+    flow.upperPopup("rootresetname/alarm", "AlarmView");
+    PopupFlow::rule("rootresetname/warn", PopupState::AllowStack, "rootresetname/alarm");
+    flow.start();
+    flow.request("rootresetname/fuel");
+    flow.request("rootresetname/warn");
+    flow.request("rootresetname/alarm");
+    QCOMPARE(flow.target.stackedPopups(), QStringList({"rootresetname/fuel"}));
+
+    Q_EMIT flow.lower->reset();
+    settle();
+
+    // What was stacked is the upper layer's, whose view is called like the lower layer's popup.
+    QCOMPARE(flow.target.stackedPopups(), QStringList());
+}
+
 void tst_PopupRootState::clearingWithoutAPopupOnlyForgets()
 {
     PopupRootState root("RootClear");
@@ -441,6 +465,27 @@ void tst_PopupRootState::clearingWithoutAPopupOnlyForgets()
 
     QVERIFY(root.wasDeactivated(&popup));
     QCOMPARE(root.activePopupState(), root.noPopupState());
+}
+
+void tst_PopupRootState::clearingLeavesAStackedSiblingStacked()
+{
+    PopupFlow flow(messages());
+    flow.popup("rootclearstack/fuel", "FuelView");
+    flow.popup("rootclearstack/call", "CallView");
+    PopupFlow::rule("rootclearstack/fuel", PopupState::AllowStack, "rootclearstack/call");
+    flow.start();
+    flow.request("rootclearstack/fuel");
+    flow.request("rootclearstack/call");
+    flow.take();
+
+    flow.lower->clearPopups();
+    settle();
+
+    // The view layer is told nothing of the one that was stacked, and goes on listing it.
+    QCOMPARE(flow.take(),
+             QStringList({"requestPopupHide CallView true", "unstackPopup CallView",
+                          "requestPopupHide CallView true", "unstackPopup CallView"}));
+    QCOMPARE(flow.target.stackedPopups(), QStringList({"FuelView"}));
 }
 
 void tst_PopupRootState::aPopupRenamedWhileItWaitsDoesNotReturn()
@@ -458,6 +503,35 @@ void tst_PopupRootState::aPopupRenamedWhileItWaitsDoesNotReturn()
     // It is on the list by its new name, and known to the layer by the one it was added with.
     QVERIFY(!fuel->isActive());
     QCOMPARE(flow.lower->activePopupState(), flow.lower->noPopupState());
+}
+
+void tst_PopupRootState::aPopupRenamedWhileItIsShownComesBackOnce()
+{
+    PopupFlow flow(messages());
+    PopupState *fuel = flow.popup("rootrenameshown/fuel", "FuelView");
+    flow.start();
+    flow.request("rootrenameshown/fuel");
+    fuel->setName("rootrenameshown/charge");
+
+    flow.request("rootrenameshown/charge_Dismiss");
+    QVERIFY(fuel->isActive());
+
+    flow.request("rootrenameshown/charge_Dismiss");
+    QVERIFY(!fuel->isActive());
+}
+
+void tst_PopupRootState::theNoPopupStateTakesItsOwnDismissal()
+{
+    PopupFlow flow(messages());
+    PopupState *none = flow.lower->noPopupState();
+    flow.start();
+    QSignalSpy entered(none, &QAbstractState::entered);
+
+    flow.request(none->name() + "_Dismiss");
+    flow.request("DismissAnyPopup");
+
+    QCOMPARE(entered.size(), 2);
+    QCOMPARE(flow.take(), QStringList());
 }
 
 void tst_PopupRootState::leavingTheLayerForgetsThoseThatWait()
