@@ -8,7 +8,7 @@ find_program(HMI_TEST_PYTHON NAMES python3 PATHS /usr/bin NO_DEFAULT_PATH)
 find_program(HMI_TEST_PYTHON NAMES python3 REQUIRED)
 
 # Pages that name tests.
-set(behaviour_pages ${PROJECT_SOURCE_DIR}/docs/behaviour.md)
+set(behaviour_pages ${PROJECT_SOURCE_DIR}/docs/behaviour.md ${PROJECT_SOURCE_DIR}/docs/limits.md)
 add_test(NAME behaviour-names COMMAND ${HMI_TEST_PYTHON} -B
     ${CMAKE_CURRENT_LIST_DIR}/testnames.py --programs $<TARGET_FILE_DIR:tst_namedstate>
     ${behaviour_pages})
