@@ -13,3 +13,12 @@ add_test(NAME behaviour-names COMMAND ${HMI_TEST_PYTHON} -B
     ${CMAKE_CURRENT_LIST_DIR}/testnames.py --programs $<TARGET_FILE_DIR:tst_namedstate>
     ${behaviour_pages})
 set_tests_properties(behaviour-names PROPERTIES LABELS "docs;package" TIMEOUT 120)
+
+# Texts that pages quote for someone who searches a log.
+add_test(NAME docs-quoted-texts COMMAND ${HMI_TEST_PYTHON} -B
+    ${CMAKE_CURRENT_LIST_DIR}/quotedtexts.py
+    --sources ${PROJECT_SOURCE_DIR}/src ${PROJECT_SOURCE_DIR}/tools
+        ${PROJECT_SOURCE_DIR}/examples/headunit
+    --pages ${PROJECT_SOURCE_DIR}/docs/why-no-popup.md
+        ${PROJECT_SOURCE_DIR}/docs/why-back-went-there.md)
+set_tests_properties(docs-quoted-texts PROPERTIES LABELS "docs;package" TIMEOUT 60)
