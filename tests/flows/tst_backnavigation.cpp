@@ -68,6 +68,7 @@ private Q_SLOTS:
     void aViewThatIsGoneIsPassedOver();
     void theDataOfAViewTellsHowItWasReachedAndLeft();
     void eachRegionGoesBackByItself();
+    void aViewLeftInAnotherRegionIsLastKnownToo();
     void aPressIsTakenByTheRegionThatHandlesIt();
 };
 
@@ -458,6 +459,29 @@ void tst_BackNavigation::eachRegionGoesBackByItself()
     QCOMPARE(flow.take(),
              QStringList({"deactivateView Scan", "deactivateView Route", "activateView Map",
                           "activateView Radio"}));
+}
+
+void tst_BackNavigation::aViewLeftInAnotherRegionIsLastKnownToo()
+{
+    ViewFlow flow;
+    auto *both = new QState(QState::ParallelStates, &flow.machine);
+    auto *left = new QState(both);
+    HmiViewState *map = flow.view("Map", left);
+    HmiViewState *route = flow.view("Route", left);
+    auto *right = new QState(both);
+    HmiViewState *radio = flow.view("Radio", right);
+    HmiViewState *scan = flow.backView("Scan", right);
+    left->setInitialState(map);
+    right->setInitialState(radio);
+    lead(QEvent::Type(QEvent::User + 1), map, route);
+    lead(QEvent::Type(QEvent::User + 1), radio, scan);
+    startIn(flow.machine, both);
+
+    flow.post(new QEvent(QEvent::Type(QEvent::User + 1)));
+
+    // Both are left, the right one first, before either is entered.
+    QCOMPARE(HmiViewState::lastKnownViewState(), QString("Map"));
+    QCOMPARE(scan->backTarget(), QString("Map"));
 }
 
 void tst_BackNavigation::aPressIsTakenByTheRegionThatHandlesIt()
