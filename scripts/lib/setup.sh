@@ -89,3 +89,6 @@ docs_packages=(doxygen graphviz python3 qtbase5-doc-dev qtdeclarative5-doc-dev)
 
 # What compares the binary interface with the committed one, and so the preset "dev".
 interface_packages=(abigail-tools python3)
+
+# What draws the diagrams of the documents.
+diagram_packages=(graphviz)

@@ -22,3 +22,10 @@ add_test(NAME docs-quoted-texts COMMAND ${HMI_TEST_PYTHON} -B
     --pages ${PROJECT_SOURCE_DIR}/docs/why-no-popup.md
         ${PROJECT_SOURCE_DIR}/docs/why-back-went-there.md)
 set_tests_properties(docs-quoted-texts PROPERTIES LABELS "docs;package" TIMEOUT 60)
+
+# Each picture of a diagram is that of its source, and says what there is.
+add_test(NAME docs-diagrams COMMAND ${HMI_TEST_PYTHON} -B
+    ${CMAKE_CURRENT_LIST_DIR}/diagrams.py
+    --docs ${PROJECT_SOURCE_DIR}/docs
+    --headers ${PROJECT_SOURCE_DIR}/src/HmiStateMachine ${PROJECT_SOURCE_DIR}/examples/headunit)
+set_tests_properties(docs-diagrams PROPERTIES LABELS "docs;package" TIMEOUT 60)
