@@ -50,25 +50,24 @@ class Programs:
         return None
 
 
-def rules_of(text):
-    """Each row of a table of tests and each section of the third level, with the line it is in."""
+def rows_of(text):
+    """Each row of a table whose last column is that of tests, with the line it is in."""
     in_table = False
-    section = None
     for number, line in enumerate(text.splitlines(), 1):
-        if line.startswith("#"):
-            if section:
-                yield section
-            section = (number, line) if line.startswith("### ") else None
-        elif section:
-            section = (section[0], section[1] + "\n" + line)
         if not line.startswith("|"):
             in_table = False
         elif re.search(r"\| Tests? \|$", line):
             in_table = True
         elif in_table and not line.startswith("|---"):
             yield number, line
-    if section:
-        yield section
+
+
+def sections_of(text):
+    """Each section of the third level, with the line it begins in."""
+    starts = [match.start() for match in re.finditer(r"^#{1,3} ", text, re.MULTILINE)]
+    for start, end in zip(starts, starts[1:] + [len(text)]):
+        if text.startswith("### ", start):
+            yield text.count("\n", 0, start) + 1, text[start:end]
 
 
 def check(page, programs, faults):
@@ -82,7 +81,7 @@ def check(page, programs, faults):
             fault = programs.fault(name)
             if fault:
                 faults.append(f"{page.name}:{number}: {name} {fault}")
-    rules = list(rules_of(text))
+    rules = list(rows_of(text)) or list(sections_of(text))
     for number, rule in rules:
         if not NAME.search(rule):
             faults.append(f"{page.name}:{number}: no test is named: {rule.splitlines()[0]}")
