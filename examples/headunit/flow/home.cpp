@@ -62,6 +62,19 @@ void switchDisplayOff()
     wake->setTargetState(state("Home/Main"));
 }
 
+// Back ends here: what the views kept to return to is not asked for any more. The library sets a
+// back stack no limit, and a driver who opens one view after the other would let it grow for ever.
+void forgetWaysBackAtHome()
+{
+    const auto views = state("Screens")->findChildren<HmiViewState *>();
+    NamedState *home = state("Home/Main");
+    QObject::connect(home, &QAbstractState::entered, home, [views] {
+        for (HmiViewState *view : views) {
+            while (!view->popBackStack().isEmpty()) { }
+        }
+    });
+}
+
 } // namespace
 
 void addHomeViews(QState *domain, const Surroundings &)
@@ -88,6 +101,7 @@ void addHomeTransitions(const Surroundings &surroundings)
     showCameraInReverse(surroundings.vehicle);
     keepCameraInFront(surroundings.keys);
     switchDisplayOff();
+    forgetWaysBackAtHome();
 }
 
 } // namespace headunit
