@@ -4,11 +4,11 @@
 #include <HmiStateMachine/hmi/hmiviewtransition.h>
 #include <HmiStateMachine/internal/logging.h>
 #include <HmiStateMachine/internal/owntransition.h>
+#include <HmiStateMachine/internal/posting.h>
 #include <HmiStateMachine/internal/targetindex.h>
 #include <HmiStateMachine/named/hmibackevent.h>
 #include <HmiStateMachine/named/hmifallbackevent.h>
 #include <HmiStateMachine/named/hmiviewevent.h>
-#include <HmiStateMachine/named/statemachine.h>
 #include <HmiStateMachine/named/viewstatetarget.h>
 
 #include <QTimer>
@@ -352,7 +352,7 @@ void HmiViewState::backToLastKnownView()
     const QString id = lastKnownViewState();
     const auto *view = qobject_cast<HmiViewState *>(stateForName(id));
     const QVariant data = view ? view->m_instanceData.value(eventDataKey()) : QVariant();
-    StateMachine::instance()->postEvent(new HmiViewEvent(id, data));
+    postToInstance(new HmiViewEvent(id, data));
 }
 
 void HmiViewState::onEntry(QEvent *event)

@@ -14,7 +14,13 @@ ViewStateTarget::ViewStateTarget(QObject *parent) : QObject(parent)
 {
 }
 
-ViewStateTarget::~ViewStateTarget() = default;
+// The flow would go on calling what is gone.
+ViewStateTarget::~ViewStateTarget()
+{
+    if (VIEW_STATE_TARGET_INSTANCE == this) {
+        VIEW_STATE_TARGET_INSTANCE = nullptr;
+    }
+}
 
 ViewStateTarget *ViewStateTarget::instance()
 {

@@ -55,7 +55,7 @@ bool PopupDismissTransition::isDismissable() const
 
 bool PopupDismissTransition::isDismissEvent(QEvent *e) const
 {
-    if (e->type() != PopupEvent::eventType()) {
+    if (!e || e->type() != PopupEvent::eventType()) {
         return false;
     }
     const QString target = static_cast<PopupEvent *>(e)->target();

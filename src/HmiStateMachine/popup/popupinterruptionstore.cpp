@@ -124,7 +124,8 @@ PopupState::InterruptionBehavior PopupInterruptionStore::getInterruptionBehavior
 PopupState::InterruptionBehavior PopupInterruptionStore::getInterruptionBehavior(
     const PopupState *popup, const PopupState *target) const
 {
-    return getInterruptionBehavior(popup->name(), target->name());
+    return popup && target ? getInterruptionBehavior(popup->name(), target->name())
+                           : PopupState::Allow;
 }
 
 bool PopupInterruptionStore::isBlockedByDomain(const QString &popup, int domain) const
@@ -145,12 +146,12 @@ bool PopupInterruptionStore::isBlockedByDomain(const QString &popup) const
 
 bool PopupInterruptionStore::isBlockedByDomain(const PopupState *popup, int domain) const
 {
-    return isBlockedByDomain(popup->popupViewId(), domain);
+    return popup && isBlockedByDomain(popup->popupViewId(), domain);
 }
 
 bool PopupInterruptionStore::isBlockedByDomain(const PopupState *popup) const
 {
-    return isBlockedByDomain(popup->popupViewId());
+    return popup && isBlockedByDomain(popup->popupViewId());
 }
 
 bool PopupInterruptionStore::isBlockedByView(const QString &popup, const QString &view) const
@@ -171,12 +172,12 @@ bool PopupInterruptionStore::isBlockedByView(const QString &popup) const
 
 bool PopupInterruptionStore::isBlockedByView(const PopupState *popup, const QString &view) const
 {
-    return isBlockedByView(popup->popupViewId(), view);
+    return popup && isBlockedByView(popup->popupViewId(), view);
 }
 
 bool PopupInterruptionStore::isBlockedByView(const PopupState *popup) const
 {
-    return isBlockedByView(popup->popupViewId());
+    return popup && isBlockedByView(popup->popupViewId());
 }
 
 void PopupInterruptionStore::loadEntry(const QJsonObject &entry, int index)

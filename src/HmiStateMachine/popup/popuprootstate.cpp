@@ -120,8 +120,10 @@ void PopupRootState::handleReset()
 void PopupRootState::clearPopups()
 {
     m_returnStack.clear();
-    if (m_activePopupState && m_activePopupState != m_noPopupState) {
-        m_activePopupState->dismissTransition()->trigger();
+    PopupDismissTransition *dismissal =
+        m_activePopupState ? m_activePopupState->dismissTransition() : nullptr;
+    if (dismissal && m_activePopupState != m_noPopupState) {
+        dismissal->trigger();
     }
 }
 
@@ -175,8 +177,11 @@ void PopupRootState::forgetDestroyed(PopupState *popup)
     if (m_activePopupState == popup) {
         m_activePopupState = nullptr;
     }
+    if (m_noPopupState == popup) {
+        m_noPopupState = nullptr;
+    }
     if (m_popupTransition->parent() == popup) {
-        m_popupTransition->setParent(m_noPopupState);
+        m_popupTransition->setParent(m_noPopupState ? static_cast<QState *>(m_noPopupState) : this);
     }
     if (m_resetTransition->parent() == popup) {
         m_resetTransition->setParent(this);

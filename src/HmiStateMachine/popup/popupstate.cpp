@@ -126,12 +126,14 @@ void PopupState::setPopupViewId(const QString &id)
 {
     m_popupViewId = id;
     TargetIndex<PopupState>::invalidate();
-    m_dismissTransition->setDismissView(id);
+    if (m_dismissTransition) {
+        m_dismissTransition->setDismissView(id);
+    }
 }
 
 QString PopupState::dismissEventIdentifier() const
 {
-    return m_dismissTransition->dismissTargetSigniture();
+    return m_dismissTransition ? m_dismissTransition->dismissTargetSigniture() : QString();
 }
 
 PopupDismissTransition *PopupState::dismissTransition() const
@@ -153,7 +155,7 @@ void PopupState::setRootState(PopupRootState *root)
     if (m_root) {
         m_root->removePopupState(this);
         // It hangs on the root while the popup is not active, and goes along.
-        if (m_dismissTransition->parent() == m_root) {
+        if (m_dismissTransition && m_dismissTransition->parent() == m_root) {
             m_dismissTransition->setParent(root ? static_cast<QState *>(root) : this);
         }
     }
@@ -283,7 +285,11 @@ void PopupState::addAutoDismissTransition()
     }
     m_autoDismissTransition = new HmiSignalTransition(m_autoDismissTimer, SIGNAL(timeout()), this);
     m_autoDismissTransition->setTargetState(m_root->noPopupState());
-    connect(m_autoDismissTimer, &QTimer::timeout, this, &PopupState::deactivate);
+    connect(m_autoDismissTimer, &QTimer::timeout, this, &PopupState::deactivate,
+            Qt::UniqueConnection);
+    // It is handed out, and may be destroyed by whoever asked for it.
+    connect(m_autoDismissTransition, &QObject::destroyed, this,
+            [this] { m_autoDismissTransition = nullptr; });
 }
 
 void PopupState::registerDismissingTransition(QAbstractTransition *t)
@@ -294,7 +300,7 @@ void PopupState::registerDismissingTransition(QAbstractTransition *t)
         return;
     }
     connect(t, &QAbstractTransition::triggered, this, &PopupState::deactivate);
-    if (!isSibling(t->targetState())) {
+    if (m_dismissTransition && !isSibling(t->targetState())) {
         connect(t, &QAbstractTransition::triggered, m_dismissTransition,
                 &PopupDismissTransition::trigger);
     }
@@ -308,7 +314,7 @@ void PopupState::registerDismissingPopup(PopupState *p)
         return;
     }
     connect(p, &PopupState::aboutToBeActivated, this, &PopupState::deactivate);
-    if (p->parentState() != parentState()) {
+    if (m_dismissTransition && p->parentState() != parentState()) {
         connect(p, &PopupState::aboutToBeActivated, m_dismissTransition,
                 &PopupDismissTransition::trigger);
     }
@@ -406,7 +412,7 @@ void PopupState::setStoreBlockedPopups(bool store)
 void PopupState::popupBlocked(PopupState *p)
 {
     // Asked also while nothing is stored: a popup may look after itself.
-    if (p->handleBlocked() || !records().storeBlockedPopups) {
+    if (!p || p->handleBlocked() || !records().storeBlockedPopups) {
         return;
     }
     records().blockedPopupStack.insert(p, QTime::currentTime());
@@ -420,6 +426,9 @@ bool PopupState::handleBlocked()
 
 void PopupState::stack(PopupState *over)
 {
+    if (!over) {
+        return;
+    }
     m_stackedBySibling = over->m_root == m_root;
     m_stackingPopupId = over->m_popupViewId;
     // A popup of the same layer is about to be left, and stacks itself then; one of another layer
@@ -459,7 +468,7 @@ void PopupState::unstackTransitions()
 
 void PopupState::activateDismissTransition()
 {
-    if (!m_root) {
+    if (!m_root || !m_dismissTransition) {
         return;
     }
     // Handed over as a child: the machine keeps no record of such a transition, so that there is
@@ -508,7 +517,7 @@ void PopupState::deactivateSource(PopupState *target)
 {
     if (target && target->m_root == m_root) {
         deactivate();
-    } else {
+    } else if (m_dismissTransition) {
         m_dismissTransition->trigger();
     }
 }
@@ -601,7 +610,8 @@ void PopupState::onEntry(QEvent *e)
     if (m_root) {
         m_root->setActivePopupState(this);
     }
-    if (m_nonDismissibleWarning && !m_dismissTransition->isDismissable()) {
+    const bool dismissable = m_dismissTransition && m_dismissTransition->isDismissable();
+    if (m_nonDismissibleWarning && !dismissable) {
         warnOfMissingDismissal();
     } else {
         activateDismissTransition();

@@ -19,12 +19,15 @@ QString monitorKey()
 PopupTimeoutMonitor::PopupTimeoutMonitor(int tickInterval, PopupState *popup)
     : QObject(popup), m_popup(popup), m_tickTimer(new QTimer(this))
 {
+    m_tickTimer->setInterval(tickInterval);
+    connect(m_tickTimer, &QTimer::timeout, this, &PopupTimeoutMonitor::timeRemainingChanged);
+    if (!popup) {
+        return;
+    }
     popup->addInstanceData(monitorKey(), QVariant::fromValue(this));
     connect(popup, &QAbstractState::entered, this, &PopupTimeoutMonitor::startMonitoring);
     connect(popup, &PopupState::alreadyActivated, this, &PopupTimeoutMonitor::startMonitoring);
     connect(popup, &QAbstractState::exited, m_tickTimer, &QTimer::stop);
-    m_tickTimer->setInterval(tickInterval);
-    connect(m_tickTimer, &QTimer::timeout, this, &PopupTimeoutMonitor::timeRemainingChanged);
 }
 
 PopupTimeoutMonitor::~PopupTimeoutMonitor()

@@ -60,7 +60,7 @@ void PopupTransition::removeTarget(PopupState *popup)
 bool PopupTransition::blockedByStacked(PopupState *popup) const
 {
     const ViewStateTarget *target = ViewStateTarget::instance();
-    if (!target) {
+    if (!target || !popup) {
         return false;
     }
     const auto *store = PopupInterruptionStore::instance();
