@@ -71,6 +71,9 @@ QQuickItem *PopupHost::topItem() const
 // A popup that is shown again, perhaps on its way out, is taken as it is.
 void PopupHost::presentPopup(const QString &popupId)
 {
+    if (!target()) {
+        return; // nobody asks but a target
+    }
     HostedItem *popup = m_popups.value(popupId);
     if (!popup && m_leaving.contains(popupId)) {
         popup = m_leaving.take(popupId);

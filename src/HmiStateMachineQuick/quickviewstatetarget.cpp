@@ -26,7 +26,9 @@ const auto entryReasonKey = QStringLiteral("entryReason");
 
 void request(const PopupState *popup)
 {
-    StateMachine::instance()->postEvent(new PopupEvent(popup->name(), QVariant()));
+    if (popup) {
+        StateMachine::instance()->postEvent(new PopupEvent(popup->name(), QVariant()));
+    }
 }
 
 // The layered state that holds the popups' root; a root may also stand alone.
@@ -344,6 +346,7 @@ void QuickViewStateTarget::releaseBlockedPopups(const QMap<PopupState *, QTime> 
 {
     const QTime now = QTime::currentTime();
     QList<PopupState *> popups = blockedPopups.keys();
+    popups.removeAll(nullptr);
     std::sort(popups.begin(), popups.end(), [&](PopupState *left, PopupState *right) {
         const int leftAge = ageMs(blockedPopups[left], now);
         const int rightAge = ageMs(blockedPopups[right], now);

@@ -75,6 +75,9 @@ QQuickItem *ScreenHost::currentItem() const
 
 void ScreenHost::presentView(const QString &viewId, bool back)
 {
+    if (!target()) {
+        return; // nobody asks but a target
+    }
     if (m_pending) {
         m_pending->discard();
         m_pending = nullptr;

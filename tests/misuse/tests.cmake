@@ -1,4 +1,9 @@
 # What happens when the library is used as it is not meant to be: docs/misuse.md.
-foreach(name IN ITEMS gonewhilerunning nullarguments)
+foreach(name IN ITEMS gonewhilerunning machinerunning nullarguments oddvalues)
     hmi_add_test(misuse ${name})
 endforeach()
+if(HMISTATEMACHINE_WITH_QUICK)
+    hmi_add_test(misuse quickviewlayer)
+    target_link_libraries(tst_quickviewlayer PRIVATE hmi_quick_test_support)
+    set_tests_properties(quickviewlayer PROPERTIES ENVIRONMENT "${HMI_OFFSCREEN_ENVIRONMENT}")
+endif()

@@ -268,8 +268,9 @@ void PopupState::restartAutoDismissTimer()
 
 int PopupState::autoDismissRemainingTime() const
 {
+    // Less than 0 when the interval is.
     return m_autoDismissTimer && m_autoDismissTimer->isActive()
-        ? m_autoDismissTimer->remainingTime()
+        ? qMax(0, m_autoDismissTimer->remainingTime())
         : 0;
 }
 
