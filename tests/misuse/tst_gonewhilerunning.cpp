@@ -39,6 +39,7 @@ private Q_SLOTS:
     void aPopupLivesWithoutItsAutoDismissTransition();
     void aLayerLivesWithoutItsNoPopupState();
     void aPopupOnTheReturnListIsDestroyed();
+    void aDestroyedPopupKeepsNobodyFromReturning();
     void aTransitionDestroyedByAGuardOfAnotherStateFiresNoMore();
     void aTransitionDeletedLaterByItsOwnGuardIsTakenOnce();
     void aStateThatIsNotActiveMayGo();
@@ -224,6 +225,23 @@ void tst_GoneWhileRunning::aPopupOnTheReturnListIsDestroyed()
     QVERIFY(!second->isActive());
     QVERIFY(flow.lower->noPopupState()->isActive());
     QVERIFY(!NamedState::stateForName("gone/first"));
+}
+
+void tst_GoneWhileRunning::aDestroyedPopupKeepsNobodyFromReturning()
+{
+    PopupFlow flow(messages());
+    PopupState *first = flow.popup("return/first", "First");
+    PopupState *second = flow.popup("return/second", "Second");
+    flow.popup("return/third", "Third");
+    flow.start();
+    flow.request("return/first");
+    flow.request("return/second");
+    flow.request("return/third");
+    delete second;
+
+    flow.request("return/third_Dismiss");
+
+    QVERIFY(first->isActive());
 }
 
 void tst_GoneWhileRunning::aTransitionDestroyedByAGuardOfAnotherStateFiresNoMore()

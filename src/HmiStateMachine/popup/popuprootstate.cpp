@@ -174,6 +174,7 @@ void PopupRootState::forgetDestroyed(PopupState *popup)
 {
     m_popupTransition->removeTarget(popup);
     m_popups.removeAll(popup);
+    m_returnStack.removeAll(popup->name()); // nobody would come back, and those below it not either
     if (m_activePopupState == popup) {
         m_activePopupState = nullptr;
     }
