@@ -92,3 +92,6 @@ interface_packages=(abigail-tools python3)
 
 # What draws the diagrams of the documents.
 diagram_packages=(graphviz)
+
+# What counts the lines and branches that tests run.
+coverage_packages=(gcovr)
