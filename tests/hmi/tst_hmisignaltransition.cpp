@@ -72,6 +72,7 @@ private Q_SLOTS:
     void aSenderDestroyedBeforeTheStartIsForgotten();
     void aSenderThatDiesWithASignalQueuedFiresNothing();
     void aSenderMayDieAfterItsTransition();
+    void nobodyIsToldThatADestroyedTransitionHasNoSender();
     void aNewSenderTakesThePlaceOfTheOldOne();
     void aTransitionDestroyedWhileItsSourceIsActiveFiresNoMore();
     void aTransitionMayBeDeletedLaterByItsOwnFiring();
@@ -585,6 +586,21 @@ void tst_HmiSignalTransition::aSenderMayDieAfterItsTransition()
     settle();
 
     QVERIFY(!flow.machine.isRunning());
+}
+
+void tst_HmiSignalTransition::nobodyIsToldThatADestroyedTransitionHasNoSender()
+{
+    Emitter emitter;
+    TwoStates flow;
+    auto *transition = new HmiSignalTransition(&emitter, SIGNAL(plain()), flow.source);
+    int told = 0;
+    connect(transition, &QSignalTransition::senderObjectChanged, this, [&told] { ++told; });
+    transition->setSenderObject(&flow.machine);
+    QCOMPARE(told, 1);
+
+    delete transition;
+
+    QCOMPARE(told, 1);
 }
 
 void tst_HmiSignalTransition::aNewSenderTakesThePlaceOfTheOldOne()

@@ -17,6 +17,7 @@ class tst_HmiViewStateBackHandling : public LibraryTest
 private Q_SLOTS:
     void handlingBackEventsMakesATransition();
     void switchingBackHandlingOffRemovesTheTransition();
+    void aBackPressThatWaitsMeanwhileIsNotHandledAnyMore();
     void aDirectBackTransitionLeadsToItsTarget();
     void aDirectBackTransitionTakesThePlaceOfBackHandling();
     void backHandlingTakesThePlaceOfADirectBackTransition();
@@ -65,6 +66,25 @@ void tst_HmiViewStateBackHandling::switchingBackHandlingOffRemovesTheTransition(
     QCOMPARE(view.transitions().size(), 1);
     QVERIFY(!transition);
     QCOMPARE(QList<QVariantList>(changes), QList<QVariantList>({{true}, {false}}));
+}
+
+void tst_HmiViewStateBackHandling::aBackPressThatWaitsMeanwhileIsNotHandledAnyMore()
+{
+    constexpr auto stop = QEvent::Type(QEvent::User + 3);
+    ViewFlow flow;
+    HmiViewState *home = flow.view("Home");
+    HmiViewState *radio = flow.backView("Radio");
+    lead(stop, radio, nullptr);
+    connect(radio->transitions().last(), &QAbstractTransition::triggered, radio,
+            [radio] { radio->setHandlesBackEvent(false); });
+    flow.start(home);
+    flow.request("Radio");
+    QCOMPARE(radio->backTarget(), QString("Home"));
+
+    flow.machine.postEvent(new QEvent(stop));
+    flow.back();
+
+    QVERIFY(radio->isActive());
 }
 
 void tst_HmiViewStateBackHandling::aDirectBackTransitionLeadsToItsTarget()
