@@ -51,6 +51,7 @@ private Q_SLOTS:
     void withoutAViewLeftBeforeItHasNoBackTarget();
     void oneBorrowedTransitionReplacesTheOther();
     void theBorrowedTransitionIsKeptFromEntryToEntry();
+    void theBorrowedDirectTransitionIsKeptFromEntryToEntry();
     void bothBorrowedTransitionsGoAfterAViewWithoutBackHandling();
     void ofTwoDummiesTheLastShownViewCounts();
     void aDummyWithBackHandlingOfItsOwnBorrowsNothing();
@@ -191,6 +192,24 @@ void tst_HmiViewStateDummy::theBorrowedTransitionIsKeptFromEntryToEntry()
     QVERIFY(first);
     QCOMPARE(flow.dummy->findChild<HmiBackTransition *>(), first.data());
     QCOMPARE(flow.backTargets(), QStringList("Radio"));
+}
+
+void tst_HmiViewStateDummy::theBorrowedDirectTransitionIsKeptFromEntryToEntry()
+{
+    DummyFlow flow;
+    HmiViewState *map = flow.view("Map");
+    flow.home->createDirectBackTransition(flow.radio);
+    map->createDirectBackTransition(flow.home);
+    flow.start(flow.home);
+    flow.request("Dummy");
+    const QPointer<HmiBackTransition> first = flow.dummy->findChild<HmiBackTransition *>();
+    flow.request("Map");
+
+    flow.request("Dummy");
+
+    QVERIFY(first);
+    QCOMPARE(flow.dummy->findChild<HmiBackTransition *>(), first.data());
+    QCOMPARE(flow.backTargets(), QStringList("Home"));
 }
 
 void tst_HmiViewStateDummy::bothBorrowedTransitionsGoAfterAViewWithoutBackHandling()

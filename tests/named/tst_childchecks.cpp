@@ -107,6 +107,7 @@ private Q_SLOTS:
     void properTransitionsOfManyStatesPass();
     void statesMayBeDestroyedBeforeTheyAreLookedAt();
     void statesMayMoveToAnotherThread();
+    void statesMayMoveWhenTheyHaveBeenLookedAt();
     void statesMayOutliveTheirThread();
 };
 
@@ -174,11 +175,26 @@ void tst_ChildChecks::statesMayMoveToAnotherThread()
     QCOMPARE(states.size(), std::size_t(stateCount - 1));
 }
 
+void tst_ChildChecks::statesMayMoveWhenTheyHaveBeenLookedAt()
+{
+    Emitter emitter;
+    States states = statesWithChildren(emitter);
+    settle();
+    QThread thread;
+
+    states.at(2)->moveToThread(&thread);
+
+    QCOMPARE(states.at(2)->thread(), &thread);
+}
+
 void tst_ChildChecks::statesMayOutliveTheirThread()
 {
     Emitter emitter;
     States states;
-    runInAThread([&] { states = statesWithChildren(emitter); });
+    runInAThread([&] {
+        states = statesWithChildren(emitter);
+        states.erase(states.begin() + 1);
+    });
     const States ours = statesWithChildren(emitter);
 
     states.clear();

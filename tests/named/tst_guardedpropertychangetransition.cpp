@@ -40,6 +40,7 @@ private Q_SLOTS:
     void aPropertyThatCannotBeWatchedNeverFires();
     void theReportIsOffWithWarnings();
     void withoutASenderItNeverFires();
+    void aSenderThatIsTakenAwayNeverFires();
     void aSenderDestroyedWhileTheMachineRunsIsForgotten();
     void aTransitionMayBeDestroyedBeforeItsSender();
 };
@@ -433,6 +434,20 @@ void tst_GuardedPropertyChangeTransition::withoutASenderItNeverFires()
 
     QVERIFY(flow.source->isActive());
     QCOMPARE(messages().take(), QStringList());
+}
+
+void tst_GuardedPropertyChangeTransition::aSenderThatIsTakenAwayNeverFires()
+{
+    Emitter emitter;
+    TwoStates flow;
+    GuardedPropertyChangeTransition transition(&emitter, "value", {}, QVariant(), flow.source);
+    transition.setTargetState(flow.target);
+    flow.start();
+
+    transition.setSenderObject(nullptr);
+    emitter.setValue(1);
+
+    QVERIFY(flow.source->isActive());
 }
 
 void tst_GuardedPropertyChangeTransition::aSenderDestroyedWhileTheMachineRunsIsForgotten()

@@ -395,6 +395,7 @@ private Q_SLOTS:
     void aMonitorRegisteredByAnotherIsToldTheNextTime();
     void aMonitorMayDeleteItselfWhileTold();
     void aMonitorDeletedByAnotherIsNotTold();
+    void aMonitorDeletedByAnotherDoesNotHearOfTheExit();
     void aMonitorDestroyedBeforehandIsNotTold();
     void aMonitorOutlivesTheMonitoredState();
     void aMonitorMayBeDestroyedAtTheEndOfTheMonitoredState();
@@ -1079,6 +1080,22 @@ void tst_NamedState::aMonitorDeletedByAnotherIsNotTold()
     QCOMPARE(flow.journal.lines(),
              QStringList(
                  {"First entered 0", "Third entered 0", "First exited 192", "Third exited 192"}));
+}
+
+void tst_NamedState::aMonitorDeletedByAnotherDoesNotHearOfTheExit()
+{
+    Flow flow;
+    Monitor first("First", flow.journal);
+    QScopedPointer<Monitor> second(new Monitor("Second", flow.journal));
+    flow.home->registerMonitoringState(&first);
+    flow.home->registerMonitoringState(second.data());
+    startIn(flow.machine, flow.home);
+    first.reaction = [&] { second.reset(); };
+
+    Q_EMIT flow.emitter.plain();
+
+    QCOMPARE(flow.journal.lines(),
+             QStringList({"First entered 0", "Second entered 0", "First exited 192"}));
 }
 
 void tst_NamedState::aMonitorDestroyedBeforehandIsNotTold()

@@ -23,6 +23,7 @@ private Q_SLOTS:
     void theFixedPartsOfDismissIdentifiers();
     void itBelongsToItsPopup();
     void aNullPopupMakesATransitionThatDoesNothing();
+    void aTransitionOfNoPopupMovesNothing();
     void theDismissTargetIsTheNameWithItsSuffix_data();
     void theDismissTargetIsTheNameWithItsSuffix();
     void theEventsThatDismiss_data();
@@ -78,6 +79,18 @@ void tst_PopupDismissTransition::aNullPopupMakesATransitionThatDoesNothing()
     QVERIFY(!transition.isDismissable());
     QVERIFY(!transition.isDismissEvent(&empty));
     QCOMPARE(transition.sourceState(), nullptr);
+}
+
+void tst_PopupDismissTransition::aTransitionOfNoPopupMovesNothing()
+{
+    PopupFlow flow(messages());
+    (new PopupDismissTransition(nullptr))->setParent(flow.lower);
+    flow.start();
+
+    flow.request("DismissAnyPopup");
+
+    QCOMPARE(flow.take(), QStringList());
+    QCOMPARE(flow.lower->activePopupState(), flow.lower->noPopupState());
 }
 
 void tst_PopupDismissTransition::theDismissTargetIsTheNameWithItsSuffix_data()

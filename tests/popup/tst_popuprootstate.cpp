@@ -59,6 +59,7 @@ private Q_SLOTS:
     void theNoPopupStateTakesItsOwnDismissal();
     void leavingTheLayerForgetsThoseThatWait();
     void handlingAResetWithoutAViewLayerForgetsAllTheSame();
+    void handlingAResetBeforeTheLayerIsEnteredHidesNothing();
     void aRootWithoutAMachineRequestsNothingAgain();
     void twoRootsActAlone();
     void aRootCanBeDeletedAlone();
@@ -560,6 +561,16 @@ void tst_PopupRootState::handlingAResetWithoutAViewLayerForgetsAllTheSame()
 
     QVERIFY(root.wasDeactivated(&popup));
     QCOMPARE(root.activePopupState(), &popup);
+}
+
+void tst_PopupRootState::handlingAResetBeforeTheLayerIsEnteredHidesNothing()
+{
+    PopupFlow flow(messages());
+    QCOMPARE(flow.lower->activePopupState(), nullptr);
+
+    flow.lower->handleReset();
+
+    QCOMPARE(flow.take(), QStringList());
 }
 
 void tst_PopupRootState::aRootWithoutAMachineRequestsNothingAgain()

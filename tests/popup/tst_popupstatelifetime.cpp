@@ -5,6 +5,7 @@
 #include "viewflow.h"
 
 #include <HmiStateMachine/hmi/hmilayeredstate.h>
+#include <HmiStateMachine/hmi/hmisignaltransition.h>
 #include <HmiStateMachine/popup/popupdismisstransition.h>
 #include <HmiStateMachine/popup/popuprootstate.h>
 
@@ -96,6 +97,7 @@ private Q_SLOTS:
     void aStoredPopupMovesToAnotherRoot();
     void aStackedPopupMovesToAnotherRoot();
     void aPopupLeavesItsRootForNone();
+    void aWaitingPopupTakesItsTransitionsAlongFromItsRoot();
     void aDismissedPopupCanBeDeletedInItsSignal();
 };
 
@@ -426,6 +428,20 @@ void tst_PopupStateLifetime::aPopupLeavesItsRootForNone()
     QVERIFY(!flow.fuel->isActive());
     QCOMPARE(flow.fuel->rootPopupState(), nullptr);
     QCOMPARE(flow.fuel->parent(), nullptr);
+    delete flow.fuel;
+}
+
+void tst_PopupStateLifetime::aWaitingPopupTakesItsTransitionsAlongFromItsRoot()
+{
+    TwoPopups flow(messages(), "lifenonewait");
+    flow.fuel->setAutoDismissTimeoutActive(true);
+    flow.bringUp();
+    QCOMPARE(flow.fuel->dismissTransition()->sourceState(), flow.lower);
+
+    flow.fuel->setRootState(nullptr);
+
+    QCOMPARE(flow.fuel->dismissTransition()->sourceState(), flow.fuel);
+    QCOMPARE(flow.fuel->autoDismissTransition()->targetState(), nullptr);
     delete flow.fuel;
 }
 

@@ -3,6 +3,7 @@
 #include "popupflow.h"
 #include "viewflow.h"
 
+#include <HmiStateMachine/hmi/hmisignaltransition.h>
 #include <HmiStateMachine/popup/popupdismisstransition.h>
 #include <HmiStateMachine/popup/popuprootstate.h>
 
@@ -64,6 +65,7 @@ private Q_SLOTS:
     void reactionsOfAStackedPopupReturnWithIt();
     void reactionsOfAnInterruptedPopupDoNotWorkOn();
     void reactionsWithATargetStay();
+    void anAutoDismissTransitionWithoutATargetStays();
     void reactionsReturnWhenTheStackedPopupIsDismissed();
     void reactionsReturnOnAReset();
     void reactionsReturnWhenThePopupIsRemoved();
@@ -197,6 +199,18 @@ void tst_PopupStateStacking::reactionsWithATargetStay()
 
     QCOMPARE(leading->sourceState(), flow.fuel);
     QCOMPARE(flow.fuel->dismissTransition()->sourceState(), flow.lower);
+}
+
+void tst_PopupStateStacking::anAutoDismissTransitionWithoutATargetStays()
+{
+    StackedPopup flow(messages(), "stacktimer");
+    flow.fuel->setAutoDismissTimeoutActive(true);
+    flow.fuel->autoDismissTransition()->setTargetState(nullptr);
+
+    flow.stack();
+
+    QCOMPARE(flow.fuel->autoDismissTransition()->sourceState(), flow.fuel);
+    QCOMPARE(flow.reaction->sourceState(), flow.lower);
 }
 
 void tst_PopupStateStacking::reactionsReturnWhenTheStackedPopupIsDismissed()

@@ -85,6 +85,7 @@ private Q_SLOTS:
     void aMonitorMayGoBeforeItsPopup();
     void aMonitorMayGoWhileItTicks();
     void aMonitorGoesWithItsPopup();
+    void aMonitorThatOutlivesItsPopupStandsStill();
     void aPopupWithoutARootIsMonitored();
 };
 
@@ -409,6 +410,23 @@ void tst_PopupTimeoutMonitor::aMonitorGoesWithItsPopup()
 
     QVERIFY(!monitor);
     QVERIFY(!tick);
+}
+
+void tst_PopupTimeoutMonitor::aMonitorThatOutlivesItsPopupStandsStill()
+{
+    auto *popup = new PopupState("car/fuel", 1);
+    popup->setAutoDismissTimeoutActive(true);
+    PopupTimeoutMonitor monitor(1000, popup);
+    monitor.setParent(nullptr);
+    monitor.startMonitoring();
+    const auto *tick = monitor.findChild<QTimer *>();
+    QVERIFY(tick->isActive());
+
+    delete popup;
+    monitor.startMonitoring();
+
+    QCOMPARE(monitor.timeRemaining(), 0);
+    QVERIFY(!tick->isActive());
 }
 
 void tst_PopupTimeoutMonitor::aPopupWithoutARootIsMonitored()
