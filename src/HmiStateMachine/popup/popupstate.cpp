@@ -229,7 +229,7 @@ void PopupState::setAutoDismissTimeoutActive(bool on)
         connect(this, &PopupState::alreadyActivated, this, &PopupState::stateEntry);
         connect(this, &QAbstractState::exited, this, &PopupState::stateExit);
         connect(m_autoDismissTimer, SIGNAL(timeout()), this, SIGNAL(popupTimeOut()));
-    } else if (m_autoDismissTimer) {
+    } else {
         disconnect(this, &QAbstractState::entered, this, &PopupState::stateEntry);
         disconnect(this, &PopupState::alreadyActivated, this, &PopupState::stateEntry);
         disconnect(this, &QAbstractState::exited, this, &PopupState::stateExit);
