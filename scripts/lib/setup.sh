@@ -95,3 +95,6 @@ diagram_packages=(graphviz)
 
 # What counts the lines and branches that tests run.
 coverage_packages=(gcovr)
+
+# What using the installed library by pkg-config and qmake needs beside that.
+package_test_packages=(pkg-config make)

@@ -1,5 +1,5 @@
-# Compiles each of HEADERS, which lie in FOLDER, as the only include of a source file, in the strictest settings that an
-# application may choose.
+# Compiles each of HEADERS, which lie in FOLDER, as the only include of a source file, and those of
+# TOGETHER, of which it takes the names, in one; in the strictest settings that an application may choose.
 
 set(options -std=c++${STANDARD} -fsyntax-only -fPIC -x c++
     -Wall -Wextra -Wpedantic -Wshadow -Woverloaded-virtual -Werror
@@ -19,20 +19,28 @@ endif()
 set(failures "")
 get_filename_component(compiler_name ${COMPILER} NAME)
 set(source_file header-${FOLDER}-${compiler_name}-${STANDARD}.cpp.in)
-foreach(header IN LISTS HEADERS)
-    # Twice: a header guards itself.
-    set(source "#include <${FOLDER}/${header}>\n#include <${FOLDER}/${header}>\n")
-    file(WRITE ${source_file} "${source}")
+
+# Each of the headers given is included twice: it guards itself.
+function(try name)
+    list(TRANSFORM ARGN REPLACE "(.+)" "#include <${FOLDER}/\\1>\n" OUTPUT_VARIABLE includes)
+    list(JOIN includes "" source)
+    file(WRITE ${source_file} "${source}${source}")
     execute_process(
         COMMAND ${COMPILER} ${options} -
         INPUT_FILE ${source_file}
         RESULT_VARIABLE result
         ERROR_VARIABLE errors)
     if(NOT result EQUAL 0)
-        list(APPEND failures ${header})
-        message("${header}:\n${errors}")
+        set(failures ${failures} ${name} PARENT_SCOPE)
+        message("${name}:\n${errors}")
     endif()
+endfunction()
+
+foreach(header IN LISTS HEADERS)
+    try(${header} ${header})
 endforeach()
+list(TRANSFORM TOGETHER REPLACE "^.*/" "")
+try("those together" ${TOGETHER})
 if(failures)
     message(FATAL_ERROR "Do not compile alone with ${COMPILER} as C++${STANDARD}: ${failures}")
 endif()

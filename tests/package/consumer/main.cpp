@@ -1,11 +1,16 @@
-#include <HmiStateMachine/hmi/hmiviewstate.h>
-#include <HmiStateMachine/named/hmiviewevent.h>
-#include <HmiStateMachine/named/statemachine.h>
+#include <HmiStateMachine/HmiViewEvent>
+#include <HmiStateMachine/HmiViewState>
+#include <HmiStateMachine/StateMachine>
+#include <HmiStateMachine/hmistatemachine_version.h>
 
 #include <QCoreApplication>
 #include <QMetaType>
 
 #include <cstdio>
+
+#if HMISTATEMACHINE_VERSION < HMISTATEMACHINE_VERSION_CHECK(0, 1, 0)
+#error "The version is not one to be compared"
+#endif
 
 using namespace HmiStateMachine;
 
@@ -13,19 +18,19 @@ int main(int argc, char **argv)
 {
     QCoreApplication app(argc, argv);
     StateMachine *machine = StateMachine::instance();
-    auto *home = new HmiViewState("Home", machine);
-    auto *radio = new HmiViewState("Radio", machine);
+    auto *home = new HmiViewState(QStringLiteral("Home"), machine);
+    auto *radio = new HmiViewState(QStringLiteral("Radio"), machine);
     machine->setInitialState(home);
     machine->start();
     QCoreApplication::sendPostedEvents();
 
-    machine->postEvent(new HmiViewEvent("Radio", QVariant()));
+    machine->postEvent(new HmiViewEvent(QStringLiteral("Radio"), QVariant()));
     QCoreApplication::sendPostedEvents();
 
     // The type is registered while the library is loaded, in a static one too.
     if (!radio->isActive() || QMetaType::type("Identifier") == QMetaType::UnknownType) {
         return 1;
     }
-    std::puts("the radio is shown");
+    std::puts(HMISTATEMACHINE_VERSION_STRING ": the radio is shown");
     return 0;
 }

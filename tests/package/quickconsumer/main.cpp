@@ -1,8 +1,4 @@
-#include <HmiStateMachine/hmi/hmiviewstate.h>
-#include <HmiStateMachine/named/statemachine.h>
-#include <HmiStateMachineQuick/quickviewstatetarget.h>
-#include <HmiStateMachineQuick/requests.h>
-#include <HmiStateMachineQuick/screenhost.h>
+#include <HmiStateMachineQuick/HmiStateMachineQuick>
 
 #include <QGuiApplication>
 #include <QQmlComponent>
@@ -33,14 +29,14 @@ int main(int argc, char **argv)
     QGuiApplication app(argc, argv);
     QuickViewStateTarget target;
     StateMachine *machine = StateMachine::instance();
-    auto *home = new HmiViewState("Home", machine);
-    new HmiViewState("Radio", machine);
+    auto *home = new HmiViewState(QStringLiteral("Home"), machine);
+    new HmiViewState(QStringLiteral("Radio"), machine);
     machine->setInitialState(home);
 
     // The component has its resources in a static library too.
     QQmlEngine engine;
     QQmlComponent component(&engine);
-    component.setData(scene, QUrl("file:///Scene.qml"));
+    component.setData(scene, QUrl(QStringLiteral("file:///Scene.qml")));
     const std::unique_ptr<QObject> root(component.create());
     const auto *host = qobject_cast<ScreenHost *>(root.get());
     if (!host) {
@@ -49,11 +45,11 @@ int main(int argc, char **argv)
     }
     machine->start();
     QCoreApplication::sendPostedEvents();
-    target.requests()->view("Radio");
+    target.requests()->view(QStringLiteral("Radio"));
     QCoreApplication::sendPostedEvents();
 
     std::puts(qPrintable(host->currentItem()->objectName()));
     target.requests()->setChecksIds(true);
-    target.requests()->view("Nowhere"); // shows the banner
-    return host->findChild<QQuickItem *>("warningBanner") ? 0 : 1;
+    target.requests()->view(QStringLiteral("Nowhere")); // shows the banner
+    return host->findChild<QQuickItem *>(QStringLiteral("warningBanner")) ? 0 : 1;
 }

@@ -1,0 +1,46 @@
+# Each public class that a header in SOURCE_DIR/LIBRARY declares has, in PREFIX, a header of its own
+# name that includes just that one; there is no other header without a suffix; and the header of the
+# library's name includes every header.
+
+cmake_minimum_required(VERSION 3.22)
+set(include_dir ${PREFIX}/include/${LIBRARY})
+set(classes ${LIBRARY})
+file(GLOB_RECURSE headers RELATIVE ${SOURCE_DIR} ${SOURCE_DIR}/${LIBRARY}/*.h)
+list(FILTER headers EXCLUDE REGEX "/internal/")
+string(TOLOWER ${LIBRARY}.h umbrella_name)
+file(READ ${include_dir}/${umbrella_name} umbrella)
+foreach(header IN LISTS headers)
+    file(STRINGS ${SOURCE_DIR}/${header} lines
+        REGEX "^(class|struct) [A-Z]+_EXPORT |^template .*> class |^typedef ")
+    if(NOT umbrella MATCHES "#include <${header}>\n")
+        message(SEND_ERROR "<${LIBRARY}/${LIBRARY}> does not include ${header}")
+    endif()
+    foreach(line IN LISTS lines)
+        string(REGEX REPLACE "^typedef [A-Za-z]+ ([A-Za-z]+);$" "> class \\1" line "${line}")
+        if(NOT line MATCHES "(_EXPORT|> class) ([A-Za-z]+)( :|$)")
+            continue() # a forward declaration
+        endif()
+        set(class ${CMAKE_MATCH_2})
+        list(APPEND classes ${class})
+        if(NOT EXISTS ${include_dir}/${class})
+            message(SEND_ERROR "No header <${LIBRARY}/${class}>")
+            continue()
+        endif()
+        file(READ ${include_dir}/${class} text)
+        if(NOT text STREQUAL "#pragma once\n\n#include <${header}>\n")
+            message(SEND_ERROR "<${LIBRARY}/${class}> does not include ${header} alone:\n${text}")
+        endif()
+    endforeach()
+endforeach()
+
+file(GLOB installed RELATIVE ${include_dir} ${include_dir}/*)
+foreach(name IN LISTS installed)
+    if(NOT name MATCHES "\\.h$" AND NOT IS_DIRECTORY ${include_dir}/${name}
+            AND NOT name IN_LIST classes)
+        message(SEND_ERROR "<${LIBRARY}/${name}> is the name of no class")
+    endif()
+endforeach()
+list(LENGTH classes count)
+if(count LESS LEAST)
+    message(SEND_ERROR "Found ${count} classes of ${LIBRARY}, fewer than ${LEAST}")
+endif()
