@@ -96,5 +96,8 @@ diagram_packages=(graphviz)
 # What counts the lines and branches that tests run.
 coverage_packages=(gcovr)
 
+# What making Debian packages needs beside that, and looking into them.
+debian_packages=(dpkg-dev file lintian)
+
 # What using the installed library by pkg-config and qmake needs beside that.
-package_test_packages=(pkg-config make)
+package_test_packages=(pkg-config make "${debian_packages[@]}")
