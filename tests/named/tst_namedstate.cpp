@@ -357,6 +357,7 @@ private Q_SLOTS:
     void anUnknownNameFindsNothing();
     void theSecondStateOfANameIsLeftWithoutOne();
     void aCollisionIsReportedWithBothStates();
+    void aCollisionLeavesTheStateOfAnotherThreadAlone();
     void aCollisionIsSilentWhileWarningsAreOff();
     void theLosersEndLeavesTheWinnersName();
     void aDestroyedStateFreesItsName();
@@ -547,6 +548,22 @@ void tst_NamedState::aCollisionIsReportedWithBothStates()
                      " Colliding state: "
                      " HmiStateMachine::NamedState(%2, name = \"Radio\")")
                  .arg(address(&loser), address(&holder)));
+}
+
+void tst_NamedState::aCollisionLeavesTheStateOfAnotherThreadAlone()
+{
+    // The other thread may be renaming it just now, so that its object name must not be read.
+    ChoosingState holder("Radio");
+    holder.setObjectName("Renamed");
+
+    runTogether(1, [](int) { NamedState loser("Radio"); });
+
+    const QStringList warnings = messages().take();
+    QCOMPARE(warnings.size(), 1);
+    QVERIFY2(warnings.first().endsWith(
+                 QString(" Colliding state:  HmiStateMachine::NamedState(%1, name = \"Radio\")")
+                     .arg(address(&holder))),
+             qPrintable(warnings.first()));
 }
 
 void tst_NamedState::aCollisionIsSilentWhileWarningsAreOff()

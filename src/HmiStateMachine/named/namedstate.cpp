@@ -11,6 +11,7 @@
 #include <QHash>
 #include <QMutex>
 #include <QPointer>
+#include <QThread>
 #include <QVector>
 
 #include <mutex>
@@ -40,6 +41,25 @@ Q_ALWAYS_INLINE Registry &registry()
     return instance;
 }
 
+struct Holder
+{
+    const QObject *state;
+    const QString &name;
+};
+
+// A state of another thread may be renamed or destroyed meanwhile: not even its object name is
+// read, and what is written of it is what the registry knows.
+QDebug operator<<(QDebug debug, const Holder &holder)
+{
+    if (holder.state->thread() == QThread::currentThread()) {
+        return debug << holder.state;
+    }
+    const QDebugStateSaver saver(debug);
+    debug.nospace() << NamedState::staticMetaObject.className() << '('
+                    << static_cast<const void *>(holder.state) << ", name = " << holder.name << ')';
+    return debug;
+}
+
 void warnOfCollision(const QString &name, const QObject *state, const QObject *holder)
 {
     // The registry is locked: nothing here may call it.
@@ -47,7 +67,7 @@ void warnOfCollision(const QString &name, const QObject *state, const QObject *h
         << "NamedState name collision detected!\n"
         << QStringLiteral("Name: \"") + name + QStringLiteral("\"\n") << "This state: " << state
         << "\n"
-        << "Colliding state: " << holder;
+        << "Colliding state: " << Holder{holder, name};
 }
 
 // One walk up the bases in place of two casts: every child of every state comes through here.
