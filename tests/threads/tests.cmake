@@ -15,7 +15,6 @@ if(HMISTATEMACHINE_SANITIZE MATCHES thread)
         target_sources(tst_${name} PRIVATE threads/tsanlocks.cpp)
         target_link_libraries(tst_${name} PRIVATE ${CMAKE_DL_LIBS})
     endforeach()
-    target_compile_definitions(tst_postingthreads PRIVATE HMI_THREAD_SANITIZER)
     set(suppressions suppressions=${CMAKE_CURRENT_SOURCE_DIR}/threads/suppressions.tsan)
     set_tests_properties(registrythreads PROPERTIES ENVIRONMENT
         "HMI_THREADS_MS=10000;TSAN_OPTIONS=${suppressions}")

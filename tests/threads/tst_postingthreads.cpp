@@ -12,7 +12,7 @@
 #include <thread>
 #include <vector>
 
-#if defined(HMI_THREAD_SANITIZER)
+#if defined(__SANITIZE_THREAD__)
 #include <sanitizer/tsan_interface.h>
 #endif
 
@@ -27,7 +27,7 @@ constexpr int eventsEach = 5000;
 // not see.
 void handOver(QEvent *event)
 {
-#if defined(HMI_THREAD_SANITIZER)
+#if defined(__SANITIZE_THREAD__)
     __tsan_release(event);
 #else
     Q_UNUSED(event)
@@ -36,7 +36,7 @@ void handOver(QEvent *event)
 
 void receive(QEvent *event)
 {
-#if defined(HMI_THREAD_SANITIZER)
+#if defined(__SANITIZE_THREAD__)
     __tsan_acquire(event);
 #else
     Q_UNUSED(event)

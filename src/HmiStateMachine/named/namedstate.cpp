@@ -49,7 +49,7 @@ struct Holder
 
 // A state of another thread may be renamed or destroyed meanwhile: not even its object name is
 // read, and what is written of it is what the registry knows.
-QDebug operator<<(QDebug debug, const Holder &holder)
+QDebug operator<<(QDebug debug, Holder holder)
 {
     if (holder.state->thread() == QThread::currentThread()) {
         return debug << holder.state;
