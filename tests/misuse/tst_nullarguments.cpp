@@ -159,13 +159,14 @@ void tst_NullArguments::aBoundViewWithoutAPropertyNameIsNeverPermitted()
         new HmiPropertyBoundFallbackViewState(QStringLiteral("Bound"), QStringLiteral("Home"),
                                               &object, nullptr, {1}, &flow.machine, true);
 
+    // The process-wide machine is asked to fall back, which does not run here.
+    QTest::ignoreMessage(QtWarningMsg,
+                         "QStateMachine::postEvent: cannot post event when the state "
+                         "machine is not running");
     flow.start(bound);
 
     QVERIFY(bound->isActive());
     QVERIFY(!flow.take().contains(QStringLiteral("activateView Bound")));
-    QCOMPARE(messages().take(),
-             QStringList("warning postToInstance: StateMachine::instance() is not running, dropped "
-                         "an event of type 1264"));
 }
 
 void tst_NullArguments::noStateIsABackTarget()

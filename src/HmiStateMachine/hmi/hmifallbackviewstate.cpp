@@ -2,8 +2,8 @@
 
 #include <HmiStateMachine/hmi/hmifallbacktransition.h>
 #include <HmiStateMachine/internal/owntransition.h>
-#include <HmiStateMachine/internal/posting.h>
 #include <HmiStateMachine/named/hmifallbackevent.h>
+#include <HmiStateMachine/named/statemachine.h>
 
 namespace HmiStateMachine {
 
@@ -25,7 +25,7 @@ HmiFallbackViewState::~HmiFallbackViewState() = default;
 
 void HmiFallbackViewState::postFallbackEvent()
 {
-    postToInstance(new HmiFallbackEvent(fallbackTarget()));
+    StateMachine::instance()->postEvent(new HmiFallbackEvent(fallbackTarget()));
 }
 
 void HmiFallbackViewState::reevaluate()

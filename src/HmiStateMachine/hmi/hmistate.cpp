@@ -3,6 +3,7 @@
 #include <HmiStateMachine/hmi/hmisignaltransition.h>
 #include <HmiStateMachine/internal/exclusivelayer.h>
 #include <HmiStateMachine/internal/logging.h>
+#include <HmiStateMachine/internal/viewlayer.h>
 #include <HmiStateMachine/named/viewstatetarget.h>
 
 namespace HmiStateMachine {
@@ -75,7 +76,7 @@ void HmiState::onEntry(QEvent *event)
     HMI_DEBUG(hmiperformance()) << screenEntryMarker;
     HMI_DEBUG(hmitrace()) << screenEntryMarker;
     NamedState::onEntry(event);
-    ViewStateTarget *target = ViewStateTarget::instance();
+    ViewStateTarget *target = viewLayer();
     if (!target) {
         return;
     }

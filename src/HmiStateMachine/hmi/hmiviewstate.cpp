@@ -4,11 +4,12 @@
 #include <HmiStateMachine/hmi/hmiviewtransition.h>
 #include <HmiStateMachine/internal/logging.h>
 #include <HmiStateMachine/internal/owntransition.h>
-#include <HmiStateMachine/internal/posting.h>
 #include <HmiStateMachine/internal/targetindex.h>
+#include <HmiStateMachine/internal/viewlayer.h>
 #include <HmiStateMachine/named/hmibackevent.h>
 #include <HmiStateMachine/named/hmifallbackevent.h>
 #include <HmiStateMachine/named/hmiviewevent.h>
+#include <HmiStateMachine/named/statemachine.h>
 #include <HmiStateMachine/named/viewstatetarget.h>
 
 #include <QTimer>
@@ -316,7 +317,7 @@ void HmiViewState::setActivationData(QVariant data)
     }
     m_activationData = data;
     Q_EMIT activationDataChanged(data);
-    ViewStateTarget *target = ViewStateTarget::instance();
+    ViewStateTarget *target = viewLayer();
     if (isActive() && target) {
         Q_EMIT target->activeViewDataChanged(data);
     }
@@ -352,7 +353,7 @@ void HmiViewState::backToLastKnownView()
     const QString id = lastKnownViewState();
     const auto *view = qobject_cast<HmiViewState *>(stateForName(id));
     const QVariant data = view ? view->m_instanceData.value(eventDataKey()) : QVariant();
-    postToInstance(new HmiViewEvent(id, data));
+    StateMachine::instance()->postEvent(new HmiViewEvent(id, data));
 }
 
 void HmiViewState::onEntry(QEvent *event)
@@ -390,7 +391,7 @@ void HmiViewState::onExit(QEvent *event)
         }
     }
     m_instanceData.insert(QStringLiteral("exitReason"), exitReason);
-    ViewStateTarget *target = ViewStateTarget::instance();
+    ViewStateTarget *target = viewLayer();
     if (target && !m_targetView.isEmpty()) {
         target->deactivateView(m_targetView, QVariant(m_instanceData));
     }
@@ -410,7 +411,7 @@ void HmiViewState::monitoredStateEntered(QEvent *event)
 void HmiViewState::onActivated()
 {
     static const char signature[] = "virtual void HmiStateMachine::HmiViewState::onActivated()";
-    ViewStateTarget *target = ViewStateTarget::instance();
+    ViewStateTarget *target = viewLayer();
     const bool isDummy = m_targetView.isEmpty();
     if (isDummy) {
         HMI_DEBUG(hmistatemachine()) << signature << "Dummy view state activated";
@@ -521,14 +522,14 @@ void HmiViewState::unregisterBackStackMonitor()
 
 void HmiViewState::requestFollowOnBackEvent()
 {
-    if (ViewStateTarget *target = ViewStateTarget::instance()) {
+    if (ViewStateTarget *target = viewLayer()) {
         target->postFollowOnBackEvent(m_backDepth, m_backTargetId, m_targetView);
     }
 }
 
 void HmiViewState::setViewStatusConnectionActive(bool on)
 {
-    ViewStateTarget *target = ViewStateTarget::instance();
+    ViewStateTarget *target = viewLayer();
     if (on == m_viewStatusConnectionActive || !target) {
         return;
     }

@@ -2,6 +2,7 @@
 
 #include <HmiStateMachine/internal/helpers.h>
 #include <HmiStateMachine/internal/logging.h>
+#include <HmiStateMachine/internal/viewlayer.h>
 #include <HmiStateMachine/named/namedstate.h>
 #include <HmiStateMachine/named/parallelsiblingtransitiongroup.h>
 #include <HmiStateMachine/named/viewstatetarget.h>
@@ -106,7 +107,7 @@ void NamedTargetTransitionBase::finishTransition()
     if (!m_isVREvent) {
         return;
     }
-    if (ViewStateTarget *target = ViewStateTarget::instance()) {
+    if (ViewStateTarget *target = viewLayer()) {
         target->setVRViewRequest(true, m_vrEventData);
     }
 }

@@ -1,7 +1,10 @@
 #include <HmiStateMachine/named/viewstatetarget.h>
 
 #include <HmiStateMachine/internal/metatypes.h>
+#include <HmiStateMachine/internal/viewlayer.h>
 #include <HmiStateMachine/popup/popupstate.h>
+
+#include <QVector>
 
 namespace HmiStateMachine {
 
@@ -10,16 +13,32 @@ Q_CONSTRUCTOR_FUNCTION(registerMetaTypes)
 
 ViewStateTarget *ViewStateTarget::VIEW_STATE_TARGET_INSTANCE = nullptr;
 
-ViewStateTarget::ViewStateTarget(QObject *parent) : QObject(parent)
+namespace {
+
+// Those that exist, as a rule one. The published pointer is the application's own and may outlive
+// what it points to.
+QVector<ViewStateTarget *> &existingTargets()
 {
+    static QVector<ViewStateTarget *> targets;
+    return targets;
 }
 
-// The flow would go on calling what is gone.
+} // namespace
+
+ViewStateTarget *viewLayer()
+{
+    ViewStateTarget *published = ViewStateTarget::instance();
+    return existingTargets().contains(published) ? published : nullptr;
+}
+
+ViewStateTarget::ViewStateTarget(QObject *parent) : QObject(parent)
+{
+    existingTargets().append(this);
+}
+
 ViewStateTarget::~ViewStateTarget()
 {
-    if (VIEW_STATE_TARGET_INSTANCE == this) {
-        VIEW_STATE_TARGET_INSTANCE = nullptr;
-    }
+    existingTargets().removeOne(this);
 }
 
 ViewStateTarget *ViewStateTarget::instance()

@@ -36,8 +36,8 @@ public:
     ~ViewStateTarget() override;
 
     /**
-     * Set by the application, null until then; the destructor of the instance sets it to null. The
-     * library assigns nothing else to it.
+     * Set by the application, null until then and never assigned by the library: an application
+     * that deletes its instance sets this to null. Until it does, the library calls nobody.
      */
     static ViewStateTarget *VIEW_STATE_TARGET_INSTANCE;
 

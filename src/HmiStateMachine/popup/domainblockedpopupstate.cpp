@@ -1,5 +1,6 @@
 #include <HmiStateMachine/popup/domainblockedpopupstate.h>
 
+#include <HmiStateMachine/internal/viewlayer.h>
 #include <HmiStateMachine/named/viewstatetarget.h>
 #include <HmiStateMachine/popup/popupinterruptionstore.h>
 
@@ -37,7 +38,7 @@ void DomainBlockedPopupState::makeConnections()
 
 bool DomainBlockedPopupState::handleDomainBlocked()
 {
-    ViewStateTarget *target = ViewStateTarget::instance();
+    ViewStateTarget *target = viewLayer();
     if (!target
         || !PopupInterruptionStore::instance()->isBlockedByDomain(this, target->activeDomain())) {
         return false;
@@ -56,7 +57,7 @@ void DomainBlockedPopupState::onDeactivated()
 
 void DomainBlockedPopupState::disconnectDomainMonitoring()
 {
-    if (ViewStateTarget *target = ViewStateTarget::instance()) {
+    if (ViewStateTarget *target = viewLayer()) {
         disconnect(target, &ViewStateTarget::activeDomainChanged, this,
                    &DomainBlockedPopupState::activeDomainChanged);
     }
@@ -65,7 +66,7 @@ void DomainBlockedPopupState::disconnectDomainMonitoring()
 void DomainBlockedPopupState::activeDomainChanged(int newDomain, int oldDomain)
 {
     Q_UNUSED(oldDomain)
-    ViewStateTarget *target = ViewStateTarget::instance();
+    ViewStateTarget *target = viewLayer();
     if (!target || PopupInterruptionStore::instance()->isBlockedByDomain(this, newDomain)) {
         return;
     }

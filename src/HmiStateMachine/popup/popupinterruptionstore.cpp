@@ -2,6 +2,7 @@
 
 #include <HmiStateMachine/internal/logging.h>
 #include <HmiStateMachine/internal/rulename.h>
+#include <HmiStateMachine/internal/viewlayer.h>
 #include <HmiStateMachine/named/viewstatetarget.h>
 
 #include <QCoreApplication>
@@ -140,7 +141,7 @@ bool PopupInterruptionStore::isBlockedByDomain(const QString &popup, int domain)
 
 bool PopupInterruptionStore::isBlockedByDomain(const QString &popup) const
 {
-    const ViewStateTarget *target = ViewStateTarget::instance();
+    const ViewStateTarget *target = viewLayer();
     return target && isBlockedByDomain(popup, target->activeDomain());
 }
 
@@ -166,7 +167,7 @@ bool PopupInterruptionStore::isBlockedByView(const QString &popup, const QString
 
 bool PopupInterruptionStore::isBlockedByView(const QString &popup) const
 {
-    const ViewStateTarget *target = ViewStateTarget::instance();
+    const ViewStateTarget *target = viewLayer();
     return target && isBlockedByView(popup, target->activeView());
 }
 
@@ -220,7 +221,7 @@ void PopupInterruptionStore::loadRules(const QString &popup, const QJsonArray &r
 void PopupInterruptionStore::loadBlacklists(const QString &popup, const QJsonObject &entry)
 {
     QList<int> domains;
-    if (ViewStateTarget *target = ViewStateTarget::instance()) {
+    if (ViewStateTarget *target = viewLayer()) {
         const QList<QString> names = readStrings(entry, "domainBlacklist");
         for (const QString &name : names) {
             domains.append(target->domainFromName(name));

@@ -1,6 +1,7 @@
 #include <HmiStateMachine/popup/popuprootstate.h>
 
 #include <HmiStateMachine/hmi/hmisignaltransition.h>
+#include <HmiStateMachine/internal/viewlayer.h>
 #include <HmiStateMachine/named/popupevent.h>
 #include <HmiStateMachine/named/viewstatetarget.h>
 #include <HmiStateMachine/popup/popupdismisstransition.h>
@@ -99,7 +100,7 @@ bool PopupRootState::wasDeactivated(PopupState *popup) const
 
 void PopupRootState::handleReset()
 {
-    if (ViewStateTarget *target = ViewStateTarget::instance()) {
+    if (ViewStateTarget *target = viewLayer()) {
         // Copied, because the view layer may answer with calls that change the list.
         const auto names = m_returnStack;
         for (const QString &name : names) {

@@ -5,6 +5,7 @@
 #include <HmiStateMachine/internal/logging.h>
 #include <HmiStateMachine/internal/slotconnection.h>
 #include <HmiStateMachine/internal/targetindex.h>
+#include <HmiStateMachine/internal/viewlayer.h>
 #include <HmiStateMachine/named/guardedpropertychangetransition.h>
 #include <HmiStateMachine/named/popupevent.h>
 #include <HmiStateMachine/named/viewstatetarget.h>
@@ -402,7 +403,7 @@ void PopupState::setStoreBlockedPopups(bool store)
     if (store) {
         return;
     }
-    if (ViewStateTarget *target = ViewStateTarget::instance()) {
+    if (ViewStateTarget *target = viewLayer()) {
         // Copied, because the application's answer may dismiss or delete popups.
         const auto released = r.blockedPopupStack;
         target->releaseBlockedPopups(released);
@@ -434,7 +435,7 @@ void PopupState::stack(PopupState *over)
     m_stackingPopupId = over->m_popupViewId;
     // A popup of the same layer is about to be left, and stacks itself then; one of another layer
     // stays entered.
-    ViewStateTarget *target = ViewStateTarget::instance();
+    ViewStateTarget *target = viewLayer();
     if (!m_stackedBySibling && target) {
         target->stackPopup(m_popupViewId, m_stackingPopupId);
     }
@@ -489,14 +490,14 @@ void PopupState::updateEventData(QEvent *e)
         return;
     }
     m_instanceData.insert(QStringLiteral("eventData"), entryData(e));
-    if (ViewStateTarget *target = ViewStateTarget::instance()) {
+    if (ViewStateTarget *target = viewLayer()) {
         target->updatePopupData(m_popupViewId, QVariant(m_instanceData));
     }
 }
 
 void PopupState::setPopupStatusConnectionActive(bool on)
 {
-    ViewStateTarget *target = ViewStateTarget::instance();
+    ViewStateTarget *target = viewLayer();
     if (on == m_popupStatusConnectionActive || !target) {
         return;
     }
@@ -619,7 +620,7 @@ void PopupState::onEntry(QEvent *e)
     }
     storeEntryData(e);
     showUnlessBlocked();
-    if (ViewStateTarget *target = ViewStateTarget::instance()) {
+    if (ViewStateTarget *target = viewLayer()) {
         domainConnection().connect(target, this);
         viewConnection().connect(target, this);
     }
@@ -634,7 +635,7 @@ void PopupState::onExit(QEvent *e)
     }
     hidePopup(true);
     activateDismissTransition();
-    if (ViewStateTarget *target = ViewStateTarget::instance()) {
+    if (ViewStateTarget *target = viewLayer()) {
         domainConnection().disconnect(target, this);
         viewConnection().disconnect(target, this);
     }
@@ -648,7 +649,7 @@ PopupState::InterruptionBehavior PopupState::interruption(PopupState *requested)
 
 void PopupState::prepareForActivation(bool reactivation)
 {
-    if (ViewStateTarget *target = ViewStateTarget::instance()) {
+    if (ViewStateTarget *target = viewLayer()) {
         target->preparePopup(m_popupViewId, reactivation);
     }
     Q_EMIT aboutToBeActivated();
@@ -662,7 +663,7 @@ void PopupState::showPopup(bool activated)
     if (isNoPopupState()) {
         return;
     }
-    if (ViewStateTarget *target = ViewStateTarget::instance()) {
+    if (ViewStateTarget *target = viewLayer()) {
         target->requestPopupShow(m_popupViewId, m_popupKind, QVariant(m_instanceData));
         target->unstackPopup(m_popupViewId);
     }
@@ -678,7 +679,7 @@ void PopupState::hidePopup(bool deactivated)
     if (isNoPopupState()) {
         return;
     }
-    if (ViewStateTarget *target = ViewStateTarget::instance()) {
+    if (ViewStateTarget *target = viewLayer()) {
         if (m_stackedBySibling) {
             target->stackPopup(m_popupViewId, m_stackingPopupId);
             stackTransitions();
@@ -724,7 +725,7 @@ void PopupState::showUnlessBlocked()
         showPopup(true);
         return;
     }
-    const ViewStateTarget *target = ViewStateTarget::instance();
+    const ViewStateTarget *target = viewLayer();
     HMI_DEBUG_FROM(hmistatemachine(), "onEntry")
         << "Popup:" << m_popupViewId
         << "blocked by domain:" << (target ? target->activeDomain() : noDomain);

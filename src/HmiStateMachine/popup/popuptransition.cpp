@@ -1,6 +1,7 @@
 #include <HmiStateMachine/popup/popuptransition.h>
 
 #include <HmiStateMachine/internal/logging.h>
+#include <HmiStateMachine/internal/viewlayer.h>
 #include <HmiStateMachine/named/popupevent.h>
 #include <HmiStateMachine/named/viewstatetarget.h>
 #include <HmiStateMachine/popup/popupinterruptionstore.h>
@@ -59,7 +60,7 @@ void PopupTransition::removeTarget(PopupState *popup)
 
 bool PopupTransition::blockedByStacked(PopupState *popup) const
 {
-    const ViewStateTarget *target = ViewStateTarget::instance();
+    const ViewStateTarget *target = viewLayer();
     if (!target || !popup) {
         return false;
     }
