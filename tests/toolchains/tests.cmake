@@ -10,6 +10,6 @@ foreach(processor IN ITEMS aarch64 x86_64)
         -D VARIANT=${HMI_QNX_VARIANT_OF_${processor}}
         -D COMPILER=${HMI_TEST_TOOLCHAIN_GXX}
         -D WORK_DIR=${CMAKE_CURRENT_BINARY_DIR}/toolchain-qnx7-${processor}
-        -P ${CMAKE_CURRENT_LIST_DIR}/toolchains/toolchain.cmake)
+        -P ${CMAKE_CURRENT_LIST_DIR}/toolchain.cmake)
     set_tests_properties(toolchain-qnx7-${processor} PROPERTIES LABELS package TIMEOUT 120)
 endforeach()

@@ -46,7 +46,8 @@ def dump(library, sources, target):
                               capture_output=True, check=False)
         if done.returncode or not everything.exists():
             raise Trouble(f"abidw {library}: {done.returncode}\n{done.stdout}{done.stderr}")
-        reduce_file(everything, target, Path(sources).resolve())
+        if not reduce_file(everything, target, Path(sources).absolute()):
+            raise Trouble(f"{library} has no class out of headers in {sources}, or no debug information")
 
 
 def abidiff(before, after, *options):

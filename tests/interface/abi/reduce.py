@@ -197,9 +197,11 @@ def class_of(symbol):
 
 
 def reduce_file(source, target, sources):
-    corpus = ElementTree.parse(source).getroot()
-    tree = ElementTree.ElementTree(Reduction(corpus, sources).result())
+    """False when nothing is left."""
+    reduction = Reduction(ElementTree.parse(source).getroot(), sources)
+    tree = ElementTree.ElementTree(reduction.result())
     ElementTree.indent(tree, " ")
     tree.write(target, encoding="utf-8")
     with open(target, "a", encoding="utf-8") as file:
         file.write("\n")
+    return bool(reduction.reduced)

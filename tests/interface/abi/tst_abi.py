@@ -96,9 +96,9 @@ class Checker(unittest.TestCase):
                         "-o", self.folder / "library.so",
                         *sorted((self.folder / "src").glob("*.cpp"))], check=True)
 
-    def run_tool(self, task):
+    def run_tool(self, task, sources="src"):
         return subprocess.run([sys.executable, "-B", HERE / "abi.py", task, self.folder / "library.so",
-                               self.folder / "src", self.reference],
+                               self.folder / sources, self.reference],
                               text=True, capture_output=True, check=False)
 
     def compare(self, *changes):
@@ -204,6 +204,12 @@ class Troubles(Checker):
         self.reference.write_text("", encoding="utf-8")
         done = self.run_tool("compare")
         self.assertIn("library.so", done.stderr)
+        self.assertEqual(done.returncode, 2)
+
+    def test_with_headers_of_something_else(self):
+        self.build([])
+        done = self.run_tool("write", sources="foreign/more")
+        self.assertIn("has no class out of headers in", done.stderr)
         self.assertEqual(done.returncode, 2)
 
     def test_unknown_task(self):
