@@ -1,1 +1,4 @@
-int probe() { return 0; }
+int probe()
+{
+    return 0;
+}
