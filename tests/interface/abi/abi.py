@@ -14,8 +14,8 @@ from pathlib import Path
 
 from reduce import reduce_file
 
-ABIDW = ["abidw", "--exported-interfaces-only", "--no-corpus-path", "--no-comp-dir-path", "--no-elf-needed", "--no-parameter-names",
-         "--type-id-style", "hash"]
+ABIDW = ["abidw", "--exported-interfaces-only", "--no-corpus-path", "--no-comp-dir-path",
+         "--no-elf-needed", "--no-parameter-names", "--type-id-style", "hash"]
 ABIDIFF = ["abidiff", "--no-show-locs"]
 
 # What abidiff's exit code is made of.

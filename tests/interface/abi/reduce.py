@@ -2,8 +2,8 @@
 
 Classes of the public headers stay whole, but for private functions that are not virtual, which no
 application can call. Of all other types only the name stays: another point release of Qt, or another
-internal class, is no change, and where it matters it shows in the places and sizes of members. Places in sources, and what the compiler alone decides,
-go; all object files become one.
+internal class, is no change, and where it matters it shows in the places and sizes of members.
+Places in sources, and what the compiler alone decides, go; all object files become one.
 """
 
 import re
