@@ -13,6 +13,7 @@ namespace HmiStateMachine {
 class HMISTATEMACHINEQUICK_EXPORT ViewPresenter
 {
 public:
+    /** It withdraws from the target first: see QuickViewStateTarget::setViewPresenter(). */
     virtual ~ViewPresenter();
 
     /** Shows the target's active view in place of what is shown; @p back when a back press led to
@@ -32,6 +33,7 @@ public:
 class HMISTATEMACHINEQUICK_EXPORT PopupPresenter
 {
 public:
+    /** It withdraws from the target first: see QuickViewStateTarget::setPopupPresenter(). */
     virtual ~PopupPresenter();
 
     /** Shows an entry of the target's shown popups, on top of all others. */

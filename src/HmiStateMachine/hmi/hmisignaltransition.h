@@ -32,13 +32,13 @@ public:
     HmiSignalTransition(const QObject *sender, const char *signal, QState *sourceState = nullptr);
     ~HmiSignalTransition() override;
 
-    /**
-     * A blocked transition never fires. It still counts in its sibling groups, where it takes the
-     * event from those of lower priority. Off at first.
-     */
+    /** Whether it is blocked. Off at first. */
     bool blocked() const;
 
-    /** Counts from the next event on. */
+    /**
+     * A blocked transition never fires. It still counts in its sibling groups, where it takes the
+     * event from those of lower priority.
+     */
     void setBlocked(bool blocked);
 
     /**

@@ -13,7 +13,10 @@ namespace HmiStateMachine {
 class HMISTATEMACHINE_EXPORT HmiTargetFilter
 {
 public:
+    /** For subclasses. */
     HmiTargetFilter() = default;
+
+    /** Called when nobody shares the filter any more. */
     virtual ~HmiTargetFilter();
 
     /** @p target is the name of a view state. */

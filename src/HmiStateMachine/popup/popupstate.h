@@ -101,19 +101,20 @@ public:
     /** Leaves out the warning on entry of a popup that cannot be dismissed. */
     void turnOffNonDismissibleWarning();
 
-    /** While set, interruption() decides in place of the interruption store. */
+    /** Whether interruption() decides in place of the interruption store. Off at first. */
     bool hasOwnInterruptionBehavior() const;
 
-    /** Off at first. */
+    /** Lets interruption() decide, or the interruption store. */
     void setHasOwnInterruptionBehavior(bool own);
+
+    /** Whether the popup follows the view layer's reports. Off at first. */
+    bool reportsQmlPopupStatus() const;
 
     /**
      * Lets the popup follow the view layer's reports: popupShown(), popupHidden(),
-     * popupAnimationStarted(). Off at first.
+     * popupAnimationStarted(). Counts at once for a popup that is active, else from its next entry
+     * on.
      */
-    bool reportsQmlPopupStatus() const;
-
-    /** Counts at once for a popup that is active, else from its next entry on. */
     void setReportsQmlPopupStatus(bool on);
 
     /**
