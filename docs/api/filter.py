@@ -90,10 +90,13 @@ def page_label(path):
     return "guide_" + path.stem.replace("-", "_").lower()
 
 
-def slug(heading):
+def slug(heading, known):
     """The anchor that a heading has where Markdown is read as GitHub does."""
     text = re.sub(r"[^\w\- ]", "", re.sub(r"\]\([^)]*\)", "]", heading).lower())
-    return text.strip().replace(" ", "-")
+    anchor = text.strip().replace(" ", "-")
+    known.append(anchor)
+    count = known.count(anchor) - 1
+    return f"{anchor}-{count}" if count else anchor
 
 
 def heading_label(path, anchor):
@@ -103,12 +106,12 @@ def heading_label(path, anchor):
 def reference(path, match):
     link = match[2]
     text = re.sub(r"\s+", " ", match[1].replace("`", ""))  # a reference shows them as they are
-    rest = "\n" * match[1].count("\n")
+    breaks = "\n" * match[1].count("\n")
     file_name, _, anchor = link.partition("#")
     target = (path.parent / file_name).resolve() if file_name else path
     if target.parent == ROOT / "docs" and target.suffix == ".md":
         label = heading_label(target, anchor) if anchor else page_label(target)
-        return f"[{text}](@ref {label}){rest}"
+        return f"{breaks}[{text}](@ref {label})"
     if target.exists():
         # No part of the reference: named, not linked.
         name = target.relative_to(ROOT).as_posix()
@@ -144,10 +147,10 @@ def prose(path, text, classes):
     return words(LINK.sub(lambda match: reference(path, match), text), classes)
 
 
-def labelled(path, heading):
-    """A heading with its anchor."""
+def labelled(path, heading, known):
+    """A heading with its anchor; the known ones are those above it."""
     marks, text = heading.groups()
-    label = page_label(path) if len(marks) == 1 else heading_label(path, slug(text))
+    label = page_label(path) if len(marks) == 1 else heading_label(path, slug(text, known))
     return f"{marks} {text} {{#{label}}}"
 
 
@@ -155,6 +158,7 @@ def page(path, lines):
     result = []
     block = []  # lines of prose together, because a link may go on in the next one
     classes = public_classes()
+    anchors = []
     fenced = False
     for line in lines + [""]:
         fence = line.lstrip().startswith("```")
@@ -166,7 +170,7 @@ def page(path, lines):
             result.append(prose(path, "\n".join(block), classes))
             block = []
         fenced = fenced != fence
-        result.append(labelled(path, heading) if heading else line)
+        result.append(labelled(path, heading, anchors) if heading else line)
     return result[:-1]
 
 
