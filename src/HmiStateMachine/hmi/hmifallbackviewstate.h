@@ -27,7 +27,10 @@ public:
                          const QString &fallbackState, QState *parent = nullptr);
     ~HmiFallbackViewState() override;
 
-    /** Leads to the fallback state, whether or not the view is permitted. */
+    /**
+     * Leads to the fallback state, whether or not the view is permitted. While
+     * StateMachine::instance() does not run the event is dropped, with a warning.
+     */
     void postFallbackEvent();
 
 public Q_SLOTS:

@@ -56,8 +56,9 @@ public:
     /**
      * A dummy view state that is never the last known view. With a @p timeout above 0, in
      * milliseconds, it emits dummyViewStateTimeout() that long after its entry, again and again
-     * until it is left; with @p backToLastKnown it then requests the last known view too. Without a
-     * timeout @p backToLastKnown has no effect. Owned by @p parent, or by the caller when null.
+     * until it is left; with @p backToLastKnown it then requests the last known view too, from
+     * StateMachine::instance(), and warns when that does not run. Without a timeout
+     * @p backToLastKnown has no effect. Owned by @p parent, or by the caller when null.
      */
     static HmiViewState *createDummyViewState(const QString &name, QState *parent, int timeout,
                                               bool backToLastKnown);

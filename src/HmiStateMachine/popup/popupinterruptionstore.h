@@ -75,7 +75,7 @@ public:
     PopupState::InterruptionBehavior getInterruptionBehavior(const QString &popup,
                                                              const QString &target) const;
 
-    /** By the names of the two states, neither of which may be null. */
+    /** By the names of the two states; Allow when either is null. */
     PopupState::InterruptionBehavior getInterruptionBehavior(const PopupState *popup,
                                                              const PopupState *target) const;
 
@@ -85,10 +85,10 @@ public:
     /** By the active domain; false without a view layer. */
     bool isBlockedByDomain(const QString &popup) const;
 
-    /** By its popup view id; it must not be null. */
+    /** By its popup view id; false for null. */
     bool isBlockedByDomain(const PopupState *popup, int domain) const;
 
-    /** By its popup view id and the active domain; false without a view layer. */
+    /** By its popup view id and the active domain; false for null and without a view layer. */
     bool isBlockedByDomain(const PopupState *popup) const;
 
     /** Whether the view blacklist that applies to a popup view id holds @p view. */
@@ -97,10 +97,10 @@ public:
     /** By the active view; false without a view layer. */
     bool isBlockedByView(const QString &popup) const;
 
-    /** By its popup view id; it must not be null. */
+    /** By its popup view id; false for null. */
     bool isBlockedByView(const PopupState *popup, const QString &view) const;
 
-    /** By its popup view id and the active view; false without a view layer. */
+    /** By its popup view id and the active view; false for null and without a view layer. */
     bool isBlockedByView(const PopupState *popup) const;
 
 private:

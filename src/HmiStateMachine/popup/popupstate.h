@@ -80,7 +80,10 @@ public:
     /** The target of the PopupEvent that dismisses this popup; empty when it cannot be. */
     QString dismissEventIdentifier() const;
 
-    /** Owned by the popup, although it hangs on the root while the popup waits. */
+    /**
+     * Owned by the popup, although it hangs on the root while the popup waits; null when it has
+     * been destroyed.
+     */
     PopupDismissTransition *dismissTransition() const;
 
     /** Null while it has none. */
@@ -139,7 +142,8 @@ public:
     int autoDismissRemainingTime() const;
 
     /**
-     * What the end of the time fires; null until auto-dismiss is switched on and there is a root.
+     * What the end of the time fires; null until auto-dismiss is switched on and there is a root,
+     * and when it has been destroyed.
      */
     HmiSignalTransition *autoDismissTransition() const;
 
@@ -193,8 +197,8 @@ public:
     static void setStoreBlockedPopups(bool store);
 
     /**
-     * The request for @p p, which must not be null, was refused: unless it looks after that itself,
-     * it is kept with the time while setStoreBlockedPopups() is on.
+     * The request for @p p was refused: unless it looks after that itself, it is kept with the time
+     * while setStoreBlockedPopups() is on. Null is ignored.
      */
     static void popupBlocked(PopupState *p);
 
@@ -205,8 +209,8 @@ public:
     bool handleBlocked();
 
     /**
-     * Is covered by @p over, which must not be null: a popup of another layer goes on the popup
-     * stack now, one of the same layer when it is left.
+     * Is covered by @p over: a popup of another layer goes on the popup stack now, one of the same
+     * layer when it is left. Null is ignored.
      */
     void stack(PopupState *over);
 

@@ -23,7 +23,9 @@ class HMISTATEMACHINE_EXPORT PopupTimeoutMonitor : public QObject
     Q_PROPERTY(int timeRemaining READ timeRemaining NOTIFY timeRemainingChanged)
 
 public:
-    /** Ticks every @p tickInterval milliseconds. @p popup becomes the parent and must not be null.
+    /**
+     * Ticks every @p tickInterval milliseconds. @p popup becomes the parent; without one nothing is
+     * monitored.
      */
     PopupTimeoutMonitor(int tickInterval, PopupState *popup);
     ~PopupTimeoutMonitor() override;
