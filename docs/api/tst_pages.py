@@ -94,7 +94,7 @@ class Pages(unittest.TestCase):
             self.assertTrue((output / "html" / name).exists(), name)
 
     def test_the_tag_file_names_each_class(self):
-        tags = xml.etree.ElementTree.parse(output / "HmiStateMachine.tag")
+        tags = xml.etree.ElementTree.parse(output / "html" / "HmiStateMachine.tag")
         names = {compound.findtext("name") for compound in tags.iter("compound")}
         for folder in FOLDERS.values():
             for _, name in classes(folder):
