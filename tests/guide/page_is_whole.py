@@ -1,6 +1,6 @@
-"""page_is_whole.py PAGE FOLDER...
+"""page_is_whole.py PAGE FOLDER
 
-Fails when the page does not show what a program in the folders prints, whole: each *.expected is a
+Fails when the page does not show what a program in the folder prints, whole: each *.expected is a
 block of its own. Of steps, stepNN beside each other, it fails too when the section "NN. ..." does not
 show a line that the step before did not have, so that a reader who follows the page has the step, and
 when it shows a line that the step has not.
@@ -57,12 +57,10 @@ def wrong_lines(page, folder):
         before = set(own)
 
 
-def main(page_name, *folders):
-    page = pathlib.Path(page_name).read_text()
-    faults = []
-    for folder in map(pathlib.Path, folders):
-        faults += [*missing_outputs(page, folder), *wrong_lines(page, folder)]
-    if not any(list(pathlib.Path(folder).rglob("*.expected")) for folder in folders):
+def main(page_name, folder_name):
+    page, folder = pathlib.Path(page_name).read_text(), pathlib.Path(folder_name)
+    faults = [*missing_outputs(page, folder), *wrong_lines(page, folder)]
+    if not list(folder.rglob("*.expected")):
         faults.append("there is no output to show")
     print("\n".join(faults))
     return 1 if faults else 0

@@ -9,16 +9,17 @@ function(hmi_add_guide_output name expected target)
     set_tests_properties(${name} PROPERTIES ENVIRONMENT QT_FORCE_STDERR_LOGGING=1)
 endfunction()
 
-# The code and the output on a page are those of the folders, and the page shows all output there.
-function(hmi_add_guide_page name)
+# What is on a page is in the folder, or in one of those that follow; all output in the folder is shown.
+function(hmi_add_guide_page name folder)
     set(page ${PROJECT_SOURCE_DIR}/docs/${name}.md)
+    set(folders ${folder} ${ARGN})
     add_test(NAME guide-${name}-code COMMAND ${CMAKE_COMMAND}
         -D PAGE=${page}
-        -D "EXAMPLE_DIR=${ARGN}"
+        -D "EXAMPLE_DIR=${folders}"
         -P ${PROJECT_SOURCE_DIR}/tests/quickstart/docs.cmake)
     add_test(NAME guide-${name}-whole
         COMMAND ${HMI_TEST_PYTHON} -B ${CMAKE_CURRENT_FUNCTION_LIST_DIR}/page_is_whole.py
-            ${page} ${ARGN})
+            ${page} ${folder})
     set_tests_properties(guide-${name}-code guide-${name}-whole PROPERTIES LABELS guide TIMEOUT 30)
 endfunction()
 

@@ -13,6 +13,9 @@ endfunction()
 
 set(files "")
 foreach(folder IN LISTS EXAMPLE_DIR)
+    if(NOT IS_DIRECTORY "${folder}")
+        message(FATAL_ERROR "There is no folder \"${folder}\"")
+    endif()
     file(GLOB_RECURSE found ${folder}/*.cpp ${folder}/*.h ${folder}/*.qml ${folder}/*.json
         ${folder}/*.expected ${folder}/CMakeLists.txt)
     list(APPEND files ${found})
