@@ -56,6 +56,20 @@ public:
     int heldAfterwards = -1;
 };
 
+/** Keeps what it is handed. */
+class KeepingTarget : public RecordingViewStateTarget
+{
+public:
+    using RecordingViewStateTarget::RecordingViewStateTarget;
+
+    void releaseBlockedPopups(const QMap<PopupState *, QTime> &blockedPopups) override
+    {
+        released = blockedPopups;
+    }
+
+    QMap<PopupState *, QTime> released;
+};
+
 } // namespace
 
 class tst_PopupStateBlocking : public LibraryTest
@@ -71,6 +85,7 @@ private Q_SLOTS:
     void aPopupFollowsTheViewByTheSignalsValues_data();
     void aPopupFollowsTheViewByTheSignalsValues();
     void nothingIsStoredUnlessAskedFor();
+    void aRefusedPopupIsStoredWithTheTimeOfItsLastRefusal();
     void aStoredPopupsDismissTransitionHangsOnTheRoot();
     void aPopupIsAskedToLookAfterItselfAlsoWhileNothingIsStored_data();
     void aPopupIsAskedToLookAfterItselfAlsoWhileNothingIsStored();
@@ -217,6 +232,28 @@ void tst_PopupStateBlocking::nothingIsStoredUnlessAskedFor()
 
     QCOMPARE(flow.take(), QStringList({"releaseBlockedPopups 0"}));
     QCOMPARE(popup->dismissTransition()->sourceState(), popup);
+}
+
+void tst_PopupStateBlocking::aRefusedPopupIsStoredWithTheTimeOfItsLastRefusal()
+{
+    PopupFlow flow(messages());
+    const StoringBlocked storing;
+    KeepingTarget target(flow.journal);
+    PopupState *fuel = flow.popup("blocktime/fuel", "FuelView");
+    PopupState *call = flow.popup("blocktime/call", "CallView");
+
+    PopupState::popupBlocked(fuel);
+    PopupState::popupBlocked(call);
+    const QTime before = QTime::currentTime();
+    PopupState::popupBlocked(fuel);
+    PopupState::setStoreBlockedPopups(false);
+
+    QCOMPARE(target.released.size(), 2);
+    QVERIFY(target.released.value(call).isValid());
+    QVERIFY(target.released.value(fuel).isValid());
+    // A day is not over while the test runs, unless it ends just now.
+    const int elapsed = before.msecsTo(target.released.value(fuel));
+    QVERIFY2(elapsed >= 0 || elapsed < -80000000, qPrintable(QString::number(elapsed)));
 }
 
 void tst_PopupStateBlocking::aStoredPopupsDismissTransitionHangsOnTheRoot()
