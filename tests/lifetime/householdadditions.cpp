@@ -3,7 +3,7 @@
 #include <HmiStateMachine/hmi/hmidelayedsignaltransition.h>
 #include <HmiStateMachine/hmi/hmifallbackviewstate.h>
 #include <HmiStateMachine/hmi/hmilayeredstate.h>
-#include <HmiStateMachine/hmi/hmitargetblacklistfilter.h>
+#include <HmiStateMachine/hmi/hmitargetfilter.h>
 #include <HmiStateMachine/hmi/hmiviewstate.h>
 #include <HmiStateMachine/named/guardedpropertychangetransition.h>
 #include <HmiStateMachine/named/guardedtransition.h>
@@ -19,6 +19,20 @@
 #include <HmiStateMachine/popup/popuptimeoutmonitor.h>
 
 using namespace HmiStateMachine;
+
+namespace {
+
+/** Leaves a way out of every circle of back targets, which a blacklist would not. */
+class RefusesNowAndThen : public HmiTargetFilter
+{
+public:
+    bool isValid(const QString &) const override { return ++m_asked % 3 == 0; }
+
+private:
+    mutable int m_asked = 0;
+};
+
+} // namespace
 
 void Household::addView()
 {
@@ -123,7 +137,7 @@ QAbstractTransition *Household::makeTransition(QState *source)
 void Household::addFilter()
 {
     if (HmiViewState *view = any(m_views)) {
-        m_filters.append(QSharedPointer<HmiTargetBlacklistFilter>::create(anyName()));
+        m_filters.append(QSharedPointer<RefusesNowAndThen>::create());
         view->addBackTargetFilter(m_filters.last());
     }
 }

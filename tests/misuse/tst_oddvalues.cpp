@@ -43,6 +43,7 @@ private Q_SLOTS:
     void aStateMayBeRenamedWhileItIsActive();
     void aRenamedBackTargetIsKeptWhileItIsSet();
     void aRenamedViewOnABackStackIsNotFound();
+    void aBackStackTakesANameWithEachStepForward();
     void aRenamedActivePopupComesBackOnce();
     void oneTransitionMayJoinTwoGroups();
     void aPopupWithoutALayerAmongViewsIsAPlainState();
@@ -253,6 +254,26 @@ void tst_OddValues::aRenamedViewOnABackStackIsNotFound()
 
     QVERIFY(radio->isActive());
     QCOMPARE(radio->backTarget(), QString());
+}
+
+// There is no limit: an application that goes on and on has to empty it.
+void tst_OddValues::aBackStackTakesANameWithEachStepForward()
+{
+    ViewFlow flow;
+    HmiViewState *home = flow.view("Home");
+    HmiViewState *radio = flow.backView("Radio");
+    flow.start(home);
+    for (int i = 0; i < 1000; ++i) {
+        flow.request("Radio");
+        flow.request("Home");
+    }
+
+    int names = 0;
+    while (!radio->popBackStack().isEmpty()) {
+        ++names;
+    }
+
+    QCOMPARE(names, 1000);
 }
 
 // Its layer knows it by the name that it had, and takes that for a popup which waits.
