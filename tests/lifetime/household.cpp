@@ -35,6 +35,14 @@ void loadRulesOnce()
     Q_UNUSED(loaded)
 }
 
+// Made by the application, or handed out to it: not what a layered state has inside.
+bool isMade(const NamedState *state)
+{
+    return qobject_cast<const HmiViewState *>(state) || qobject_cast<const PopupState *>(state)
+        || qobject_cast<const PopupRootState *>(state)
+        || qobject_cast<const HmiLayeredState *>(state);
+}
+
 } // namespace
 
 Household::Household(quint32 seed, bool processWide) : m_random(seed)
@@ -45,6 +53,12 @@ Household::Household(quint32 seed, bool processWide) : m_random(seed)
         m_ownMachine = std::make_unique<QStateMachine>();
         m_machine = m_ownMachine.get();
     }
+    chooseDeeds();
+    build();
+}
+
+void Household::chooseDeeds()
+{
     const auto add = [this](int weight, Deed deed) { m_deeds += QVector<Deed>(weight, deed); };
     for (const Deed deed :
          {&Household::requestView, &Household::pressBack, &Household::requestPopup,
@@ -64,7 +78,6 @@ Household::Household(quint32 seed, bool processWide) : m_random(seed)
                             &Household::renameSomething, &Household::startAnew}) {
         add(1, deed);
     }
-    build();
 }
 
 Household::~Household()
@@ -131,28 +144,27 @@ void Household::takeDown()
     if (!m_machine) {
         return;
     }
-    const bool goesWhileItRuns = m_ownMachine && m_random.oneIn(3);
-    QVector<void (Household::*)()> ends{&Household::removeTree};
+    if (m_random.oneIn(2)) {
+        m_target.reset();
+    }
+    QVector<Deed> ends{m_ownMachine && m_random.oneIn(3) ? &Household::removeMachine
+                                                         : &Household::removeTree};
     for (const Deed end : {&Household::endSender, &Household::endGroup, &Household::endFilters,
                            &Household::endMonitor}) {
         ends += QVector<Deed>(senderCount, end);
     }
-    for (int i = ends.size() - 1; i > 0; --i) {
-        std::swap(ends[i], ends[m_random.below(i + 1)]);
-    }
-    if (m_random.oneIn(2)) {
-        m_target.reset();
-    }
+    shuffle(ends);
     for (const Deed end : qAsConst(ends)) {
-        if (goesWhileItRuns && end == static_cast<Deed>(&Household::removeTree)) {
-            m_ownMachine.reset();
-        } else if (m_machine || end != static_cast<Deed>(&Household::removeTree)) {
-            (this->*end)();
-        }
+        (this->*end)();
     }
     PopupState::setStoreBlockedPopups(false);
     PopupState::setDriverRestrictionProperty(nullptr, QByteArray(), QVariant());
     settleAll();
+    removeTheRest();
+}
+
+void Household::removeTheRest()
+{
     for (const auto &sender : qAsConst(m_senders)) {
         delete sender;
     }
@@ -164,33 +176,31 @@ void Household::takeDown()
     m_machine = nullptr;
 }
 
-// Parked, a machine points at none of the states, which may then go one by one.
+// While it runs, with all its states.
+void Household::removeMachine()
+{
+    m_ownMachine.reset();
+}
+
+// Parked, a machine points at none of the states, which may then go one by one: as many as the lot
+// says, and the others with what they belong to.
 void Household::removeTree()
 {
     park(*m_machine);
-    QVector<QPointer<QObject>> all;
-    const auto objects = m_house->findChildren<QObject *>();
-    for (QObject *object : objects) {
-        if (qobject_cast<HmiViewState *>(object) || qobject_cast<QAbstractTransition *>(object)
-            || qobject_cast<PopupState *>(object) || qobject_cast<PopupRootState *>(object)
-            || qobject_cast<HmiLayeredState *>(object)) {
-            all.append(object);
+    QVector<QPointer<QObject>> parts;
+    const auto states = m_house->findChildren<NamedState *>();
+    for (NamedState *state : states) {
+        if (isMade(state)) {
+            parts.append(state);
         }
     }
-    for (int i = all.size() - 1; i > 0; --i) {
-        std::swap(all[i], all[m_random.below(i + 1)]);
+    for (const auto &transition : qAsConst(m_transitions)) {
+        parts.append(transition.data());
     }
-    const int singly = m_random.below(all.size() + 1);
-    for (int i = 0; i < singly; ++i) {
-        if (!all.at(i)) {
-            continue;
-        }
-        // These are the library's own; only whoever is asked for them hands them out.
-        const bool own = qobject_cast<QAbstractTransition *>(all.at(i))
-            && !m_transitions.contains(qobject_cast<QAbstractTransition *>(all.at(i)));
-        if (!own) {
-            delete all.at(i);
-        }
+    shuffle(parts);
+    parts.resize(m_random.below(parts.size() + 1));
+    for (const auto &part : qAsConst(parts)) {
+        delete part;
     }
     delete m_house;
 }

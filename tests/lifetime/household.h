@@ -15,6 +15,7 @@
 #include <QVector>
 
 #include <memory>
+#include <utility>
 
 namespace HmiStateMachine {
 class HmiLayeredState;
@@ -55,7 +56,10 @@ private:
     void build();
     void addLayer();
     void addView();
+    HmiStateMachine::HmiViewState *makeView(const QString &name,
+                                            HmiStateMachine::HmiLayeredState *layer);
     void addPopup();
+    void letOthersDismiss(HmiStateMachine::PopupState *popup);
     void addTransition();
     QAbstractTransition *makeTransition(QState *source);
     void addFilter();
@@ -82,8 +86,17 @@ private:
     void renameSomething();
     void startAnew();
 
+    void chooseDeeds();
     void removeTree();
+    void removeMachine();
+    void removeTheRest();
     void settleAll();
+    template <typename List> void shuffle(List &list)
+    {
+        for (int i = list.size() - 1; i > 0; --i) {
+            std::swap(list[i], list[m_random.below(i + 1)]);
+        }
+    }
     QString newName(const QString &kind);
     QString anyName();
     Emitter *anySender();

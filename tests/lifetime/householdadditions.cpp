@@ -40,19 +40,7 @@ void Household::addView()
     if (!layer) {
         return;
     }
-    HmiViewState *view = nullptr;
-    const QString name = newName(QStringLiteral("view"));
-    switch (m_random.below(5)) {
-    case 0:
-        view = HmiViewState::createDummyViewState(name, layer, 50, true);
-        break;
-    case 1:
-        view = new HmiFallbackViewState(name, anyName(), layer);
-        break;
-    default:
-        view = new HmiViewState(name, layer);
-        view->setHandlesBackEvent(!m_random.oneIn(4));
-    }
+    HmiViewState *view = makeView(newName(QStringLiteral("view")), layer);
     if (m_random.oneIn(4)) {
         view->createDirectBackTransition(any(m_views));
     }
@@ -64,6 +52,20 @@ void Household::addView()
     }
     view->setReportsQmlViewStatus(m_random.oneIn(2));
     m_views.append(view);
+}
+
+HmiViewState *Household::makeView(const QString &name, HmiLayeredState *layer)
+{
+    switch (m_random.below(5)) {
+    case 0:
+        return HmiViewState::createDummyViewState(name, layer, 50, true);
+    case 1:
+        return new HmiFallbackViewState(name, anyName(), layer);
+    default:
+        auto *view = new HmiViewState(name, layer);
+        view->setHandlesBackEvent(!m_random.oneIn(4));
+        return view;
+    }
 }
 
 void Household::addPopup()
@@ -82,14 +84,20 @@ void Household::addPopup()
     if (m_random.oneIn(3)) {
         m_monitors.append(new PopupTimeoutMonitor(20, popup));
     }
-    if (m_random.oneIn(4)) {
-        popup->registerDismissingPopup(any(m_popups) ? any(m_popups) : popup);
+    letOthersDismiss(popup);
+    m_popups.append(popup);
+}
+
+void Household::letOthersDismiss(PopupState *popup)
+{
+    PopupState *other = any(m_popups);
+    if (other && m_random.oneIn(4)) {
+        popup->registerDismissingPopup(other);
     }
     if (m_random.oneIn(4)) {
         m_transitions.append(new HmiTransition(QStringLiteral("go"), popup));
         popup->registerDismissingTransition(m_transitions.last());
     }
-    m_popups.append(popup);
 }
 
 void Household::addTransition()

@@ -1,5 +1,6 @@
 # What happens when the library is used as it is not meant to be: docs/misuse.md.
-foreach(name IN ITEMS gonewhilerunning machinerunning nullarguments oddvalues)
+foreach(name IN ITEMS
+    changedwhilerunning gonewhilerunning machinerunning nullarguments oddvalues)
     hmi_add_test(misuse ${name})
 endforeach()
 if(HMISTATEMACHINE_WITH_QUICK)

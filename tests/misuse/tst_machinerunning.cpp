@@ -1,20 +1,14 @@
 #include "driving.h"
 #include "emitter.h"
+#include "goingon.h"
 #include "librarytest.h"
-#include "popupflow.h"
-#include "twostates.h"
 #include "viewflow.h"
 
-#include <HmiStateMachine/hmi/hmisignaltransition.h>
 #include <HmiStateMachine/hmi/hmiviewstate.h>
 #include <HmiStateMachine/named/guardedtransition.h>
-#include <HmiStateMachine/named/hmibackevent.h>
 #include <HmiStateMachine/named/hmievent.h>
 #include <HmiStateMachine/named/hmitransition.h>
 #include <HmiStateMachine/named/hmiviewevent.h>
-#include <HmiStateMachine/popup/popupdismisstransition.h>
-#include <HmiStateMachine/popup/popuprootstate.h>
-#include <HmiStateMachine/popup/popupstate.h>
 
 #include <QPointer>
 #include <QThread>
@@ -47,24 +41,12 @@ private Q_SLOTS:
     void aMachineIsDestroyedBetweenTwoEvents();
     void aPlainQtStateMayStandAmongTheOthers();
     void aPlainTransitionMayStandAmongTheOthers();
-    void aTransitionAddedToAnActiveStateFires();
-    void aSignalTransitionAddedToAnActiveStateFires();
-    void aTransitionRemovedFromAnActiveStateFiresNoMore();
-    void aPopupAddedWhileTheLayerIsActiveIsRequested();
-    void aViewAddedWhileTheMachineRunsIsRequested();
 };
 
 namespace {
 
 constexpr char notRunning[] =
     "QStateMachine::postEvent: cannot post event when the state machine is not running";
-
-HmiTransition *goOn(TwoStates &flow)
-{
-    auto *transition = new HmiTransition(QStringLiteral("go"), flow.source);
-    transition->setTargetState(flow.target);
-    return transition;
-}
 
 } // namespace
 
@@ -133,8 +115,7 @@ void tst_MachineRunning::stoppingInASlotEndsTheMachine()
     connect(flow.target, &QAbstractState::entered, &flow.machine, &QStateMachine::stop);
     flow.start();
 
-    flow.machine.postEvent(new HmiEvent(QStringLiteral("go"), QVariant()));
-    settle();
+    post(flow);
 
     QVERIFY(!flow.machine.isRunning());
     QVERIFY(flow.target->isActive());
@@ -205,8 +186,7 @@ void tst_MachineRunning::aRequestFromAGuardIsTakenAfterTheStep()
     flow.start();
     QSignalSpy entered(flow.target, &QAbstractState::entered);
 
-    flow.machine.postEvent(new HmiEvent(QStringLiteral("go"), QVariant()));
-    settle();
+    post(flow);
 
     QCOMPARE(entered.size(), 1);
     QVERIFY(flow.source->isActive());
@@ -267,8 +247,7 @@ void tst_MachineRunning::aStateOfAnotherMachineStopsTheMachine()
                          "Unrecoverable error detected in running state machine: Child mode of "
                          "state machine '' is not 'ExclusiveStates'.");
 
-    flow.machine.postEvent(new HmiEvent(QStringLiteral("go"), QVariant()));
-    settle();
+    post(flow);
 
     QVERIFY(foreign->isActive());
     QVERIFY(!flow.source->isActive());
@@ -315,8 +294,7 @@ void tst_MachineRunning::aPlainQtStateMayStandAmongTheOthers()
     transition->setTargetState(flow.target);
     flow.start();
 
-    flow.machine.postEvent(new HmiEvent(QStringLiteral("go"), QVariant()));
-    settle();
+    post(flow);
 
     QVERIFY(flow.target->isActive());
 }
@@ -333,70 +311,6 @@ void tst_MachineRunning::aPlainTransitionMayStandAmongTheOthers()
     settle();
 
     QVERIFY(flow.target->isActive());
-}
-
-void tst_MachineRunning::aTransitionAddedToAnActiveStateFires()
-{
-    TwoStates flow;
-    flow.start();
-    goOn(flow);
-
-    flow.machine.postEvent(new HmiEvent(QStringLiteral("go"), QVariant()));
-    settle();
-
-    QVERIFY(flow.target->isActive());
-}
-
-void tst_MachineRunning::aSignalTransitionAddedToAnActiveStateFires()
-{
-    Emitter emitter;
-    TwoStates flow;
-    flow.start();
-    flow.source->addTransition(&emitter, SIGNAL(plain()), flow.target);
-    settle();
-
-    Q_EMIT emitter.plain();
-    settle();
-
-    QVERIFY(flow.target->isActive());
-}
-
-void tst_MachineRunning::aTransitionRemovedFromAnActiveStateFiresNoMore()
-{
-    Emitter emitter;
-    TwoStates flow;
-    const std::unique_ptr<HmiSignalTransition> transition(
-        flow.source->addTransition(&emitter, SIGNAL(plain()), flow.target));
-    flow.start();
-
-    flow.source->removeTransition(transition.get());
-    Q_EMIT emitter.plain();
-    settle();
-
-    QVERIFY(flow.source->isActive());
-    QVERIFY(!transition->sourceState());
-}
-
-void tst_MachineRunning::aPopupAddedWhileTheLayerIsActiveIsRequested()
-{
-    PopupFlow flow(messages());
-    flow.start();
-    PopupState *popup = flow.popup("late/popup", "Late");
-
-    flow.request("late/popup");
-
-    QVERIFY(popup->isActive());
-}
-
-void tst_MachineRunning::aViewAddedWhileTheMachineRunsIsRequested()
-{
-    ViewFlow flow;
-    flow.start(flow.view(QStringLiteral("Home")));
-    flow.view(QStringLiteral("Late"));
-
-    flow.request(QStringLiteral("Late"));
-
-    QCOMPARE(ViewFlow::activeView(), QString("Late"));
 }
 
 QTEST_GUILESS_MAIN(tst_MachineRunning)
