@@ -307,7 +307,8 @@ void tst_HmiTransition::dataOfEventsThatDoNotMatchIsNotKept()
     regions.post(new HmiEvent("Dial", 5));
 
     regions.post(new HmiEvent("Dial", 6));
-    regions.post(new HmiEvent("Hang up", 5));
+    QCOMPARE(transition->transitionData(), QVariant(5));
+    regions.post(new HmiEvent("Hang up", 7));
 
     QCOMPARE(transition->transitionData(), QVariant(5));
 }

@@ -169,7 +169,7 @@ void tst_SimpleEvent::aBackEventKeepsDepthAndTarget()
 
 void tst_SimpleEvent::aFallbackEventKeepsItsTarget()
 {
-    QCOMPARE(HmiFallbackEvent("Home").targetId(), QString("Home"));
+    QCOMPARE(HmiFallbackEvent("system/Home").targetId(), QString("system/Home"));
     QCOMPARE(HmiFallbackEvent(QString()).targetId(), QString());
 }
 
