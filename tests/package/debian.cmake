@@ -2,7 +2,7 @@
 # its list in debian/ names, says nothing about where it was built, and satisfies lintian.
 #
 # In a list, LIBDIR, CONFIG and VERSION stand for what the build chose. The package of the guide has no
-# list: what is in docs/ is in it. SUPPRESS: what lintian shall not look for.
+# list: what is in docs/ is in it. SUPPRESS: a tag that lintian shall not look for.
 
 cmake_minimum_required(VERSION 3.22)
 include(${CMAKE_CURRENT_LIST_DIR}/commands.cmake)
@@ -92,8 +92,11 @@ foreach(package IN LISTS lists ITEMS hmistatemachine-doc)
     endif()
 endforeach()
 
-list(JOIN SUPPRESS "," suppressed)
+set(suppress "")
+if(SUPPRESS)
+    set(suppress --suppress-tags ${SUPPRESS})
+endif()
 run(lintian --fail-on error,warning --tag-display-limit 0 --allow-root
     --suppress-tags-from-file ${SOURCE_DIR}/cmake/debian/lintian-suppressed
-    --suppress-tags "${suppressed}" ${archives})
+    ${suppress} ${archives})
 file(REMOVE_RECURSE ${unpacked})
