@@ -1,6 +1,6 @@
 # Run by CPack between installing and packing: gives each package the files that Debian wants in it.
 
-if(NOT DEFINED ENV{SOURCE_DATE_EPOCH})
+if("$ENV{SOURCE_DATE_EPOCH}" STREQUAL "")
     string(TIMESTAMP now "%s" UTC)
     set(ENV{SOURCE_DATE_EPOCH} ${now})
 endif()
