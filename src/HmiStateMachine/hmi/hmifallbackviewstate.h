@@ -29,7 +29,7 @@ public:
 
     /**
      * Leads to the fallback state, whether or not the view is permitted. While
-     * StateMachine::instance() does not run the event is dropped, with a warning.
+     * StateMachine::instance() does not run the event is lost, with a warning of Qt.
      */
     void postFallbackEvent();
 
