@@ -44,7 +44,7 @@ ScreenHost::ScreenHost(QQuickItem *parent) : SceneHost(Slide, parent)
 ScreenHost::~ScreenHost()
 {
     if (target()) {
-        detach(target());
+        ScreenHost::detach(target()); // its own: what derives from it is gone
     }
 }
 

@@ -36,7 +36,7 @@ constexpr int charactersInBlock = sizeof(quint64) / sizeof(QChar);
 
 quint64 blockAt(const QChar *at)
 {
-    quint64 block;
+    quint64 block = 0;
     std::memcpy(&block, at, sizeof block);
     return block;
 }

@@ -85,7 +85,7 @@ void PopupInterruptionStore::loadInterruptionBehaviors(const QString &fileName)
         HMI_WARNING(hmistatemachine()) << "Invalid popup interruption file." << fileName;
         return;
     }
-    QJsonParseError error;
+    QJsonParseError error{};
     const QJsonDocument document = QJsonDocument::fromJson(file.readAll(), &error);
     if (error.error != QJsonParseError::NoError) {
         HMI_WARNING(hmistatemachine())
