@@ -37,7 +37,7 @@ PopupHost::PopupHost(QQuickItem *parent) : SceneHost(Fade, parent)
 PopupHost::~PopupHost()
 {
     if (target()) {
-        detach(target());
+        PopupHost::detach(target()); // its own: what derives from it is gone
     }
 }
 
@@ -145,7 +145,9 @@ void PopupHost::detach(QuickViewStateTarget *target)
 
 void PopupHost::clear()
 {
-    for (HostedItem *popup : m_popups.values() + m_leaving.values()) {
+    QList<HostedItem *> popups = m_popups.values();
+    popups.append(m_leaving.values());
+    for (HostedItem *popup : qAsConst(popups)) {
         popup->discard();
     }
     m_popups.clear();

@@ -22,7 +22,6 @@ namespace {
 
 constexpr int tickMs = 100; // a bar of ten centimetres that empties in five seconds moves 2 mm
 constexpr int dayMs = 24 * 60 * 60 * 1000;
-const auto entryReasonKey = QStringLiteral("entryReason");
 
 void request(const PopupState *popup)
 {
@@ -72,7 +71,7 @@ QString viewIdOf(const QString &popup, const PopupListModel *shown)
     return state ? state->popupViewId() : popup;
 }
 
-int ageMs(const QTime &time, const QTime &now)
+int ageMs(QTime time, QTime now)
 {
     return (now.msecsSinceStartOfDay() - time.msecsSinceStartOfDay() + dayMs) % dayMs;
 }
@@ -258,7 +257,8 @@ void QuickViewStateTarget::activateView(const QString &viewId, const QVariant &i
         Q_EMIT activeViewChanged(viewId, m_viewBefore);
     }
     if (m_viewPresenter) {
-        m_viewPresenter->presentView(viewId, data.value(entryReasonKey).toInt() != 0);
+        m_viewPresenter->presentView(viewId,
+                                     data.value(QStringLiteral("entryReason")).toInt() != 0);
     } else {
         reportViewShown(viewId);
     }

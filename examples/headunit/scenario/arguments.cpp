@@ -120,7 +120,8 @@ QString Arguments::echo() const
 
 QString Arguments::takeWord()
 {
-    const QString result = m_rest.section(QRegularExpression("\\s"), 0, 0);
+    static const QRegularExpression blank("\\s");
+    const QString result = m_rest.section(blank, 0, 0);
     m_rest = m_rest.mid(result.size()).trimmed();
     if (!result.isEmpty()) {
         m_echo.append(result);

@@ -19,8 +19,9 @@ constexpr int maximumName = 40;
 // "017-set-vehicle.gear-R.png"
 QString fileName(int number, const QString &step)
 {
+    static const QRegularExpression unwanted("[^A-Za-z0-9.]+");
     QString text = step;
-    text.replace(QRegularExpression("[^A-Za-z0-9.]+"), "-");
+    text.replace(unwanted, "-");
     while (text.endsWith('-')) {
         text.chop(1);
     }

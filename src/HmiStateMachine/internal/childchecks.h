@@ -13,7 +13,7 @@ class NamedState;
  *
  * A state is noted at most once and remembers its place, from which it can be taken at once.
  */
-class ChildChecks : public QObject
+class ChildChecks : public QObject // clazy:exclude=missing-qobject-macro (it has no signals)
 {
 public:
     /** Those of the calling thread; they go when it ends. */

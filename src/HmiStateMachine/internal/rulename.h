@@ -42,6 +42,7 @@ private:
 
     enum Scope { Exact, AnyModule, AnyPopup };
 
+    // cppcheck-suppress unusedPrivateFunction ; the operator, a friend, uses it
     bool isAnsweredBy(QStringView stored) const;
 
     QString m_name;

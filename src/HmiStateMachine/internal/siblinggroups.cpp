@@ -11,7 +11,7 @@ ParallelSiblingTransitionGroup *ensureGroup(QPointer<ParallelSiblingTransitionGr
     if (!group) {
         group = new ParallelSiblingTransitionGroup(QCoreApplication::instance());
     }
-    return group;
+    return group.data();
 }
 
 } // namespace HmiStateMachine

@@ -15,6 +15,7 @@ namespace {
 
 QList<NamedTargetTransitionBase *> &triggeringTransitions()
 {
+    // cppcheck-suppress unassignedVariable ; it is changed through the reference
     static QList<NamedTargetTransitionBase *> s_triggeringTransitions;
     return s_triggeringTransitions;
 }

@@ -229,6 +229,8 @@ void PopupState::setAutoDismissTimeoutActive(bool on)
         connect(this, &QAbstractState::entered, this, &PopupState::stateEntry);
         connect(this, &PopupState::alreadyActivated, this, &PopupState::stateEntry);
         connect(this, &QAbstractState::exited, this, &PopupState::stateExit);
+        // By name, so that a subclass may have a signal popupTimeOut() of its own.
+        // clazy:excludeall=old-style-connect
         connect(m_autoDismissTimer, SIGNAL(timeout()), this, SIGNAL(popupTimeOut()));
     } else {
         disconnect(this, &QAbstractState::entered, this, &PopupState::stateEntry);
@@ -404,8 +406,9 @@ void PopupState::setStoreBlockedPopups(bool store)
         return;
     }
     if (ViewStateTarget *target = viewLayer()) {
-        // Copied, because the application's answer may dismiss or delete popups.
-        const auto released = r.blockedPopupStack;
+        // Copied, because the application's answer may dismiss or delete popups; a map, as the view
+        // layer takes it.
+        const auto released = r.blockedPopupStack; // clazy:exclude=qmap-with-pointer-key
         target->releaseBlockedPopups(released);
     }
     r.blockedPopupStack.clear();
