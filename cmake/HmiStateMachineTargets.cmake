@@ -10,6 +10,7 @@ function(hmi_target_defaults target)
         $<$<BOOL:${HMISTATEMACHINE_WERROR}>:-Werror>
         # Messages carry the file name of the source as it stands in the project, wherever it was built.
         -fmacro-prefix-map=${PROJECT_SOURCE_DIR}/=)
+    hmi_target_clazy(${target})
     if(HMISTATEMACHINE_SANITIZE)
         target_compile_options(${target} PRIVATE
             -fsanitize=${HMISTATEMACHINE_SANITIZE} -fno-sanitize-recover=all -fno-omit-frame-pointer)
