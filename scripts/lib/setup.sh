@@ -1,4 +1,5 @@
 # Sourced by the commands beside this folder: installs what they need and moves to the project.
+# shellcheck shell=bash disable=SC2034 # they use the names
 
 set -euo pipefail
 
@@ -101,3 +102,9 @@ debian_packages=(dpkg-dev file lintian)
 
 # What using the installed library by pkg-config and qmake needs beside that.
 package_test_packages=(pkg-config make "${debian_packages[@]}")
+
+# What looks at the code without running it: scripts/check, and so the preset "clang".
+check_packages=(clang-tidy clazy codespell cppcheck pyflakes3 shellcheck)
+
+# What the preset "tsan" needs beside the compiler.
+tsan_packages=(libtsan2)
