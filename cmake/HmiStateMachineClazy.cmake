@@ -17,7 +17,9 @@ endif()
 
 # For the library and its scene, which run in a car. A program may allocate a text.
 function(hmi_target_clazy target)
-    if(NOT HMISTATEMACHINE_CLAZY OR NOT CMAKE_CURRENT_SOURCE_DIR MATCHES "^${PROJECT_SOURCE_DIR}/src/")
+    cmake_path(SET library ${PROJECT_SOURCE_DIR}/src)
+    cmake_path(IS_PREFIX library ${CMAKE_CURRENT_SOURCE_DIR} in_library)
+    if(NOT HMISTATEMACHINE_CLAZY OR NOT in_library)
         return()
     endif()
     list(JOIN HMI_CLAZY_CHECKS "," checks)

@@ -104,7 +104,7 @@ debian_packages=(dpkg-dev file lintian)
 package_test_packages=(pkg-config make "${debian_packages[@]}")
 
 # What looks at the code without running it: scripts/check, and so the preset "clang".
-check_packages=(clang-tidy clazy codespell cppcheck pyflakes3 shellcheck)
+check_packages=(clang-tidy clazy codespell cppcheck pyflakes3 python3 shellcheck)
 
 # What the preset "tsan" needs beside the compiler.
 tsan_packages=(libtsan2)
