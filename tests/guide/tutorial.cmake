@@ -23,12 +23,12 @@ endif()
 
 hmi_add_guide_page(tutorial ${tutorial_dir})
 
-# It can be copied out of here, and built with what is installed.
+# It can be copied out of here, and built with what is installed: the last step, which needs the most.
 if(HMISTATEMACHINE_TEST_PACKAGE)
     add_test(NAME tutorial-alone COMMAND ${CMAKE_COMMAND}
         -D BUILD_DIR=${PROJECT_BINARY_DIR}
         -D EXAMPLE_DIR=${tutorial_dir}
-        -D PROGRAM=tutorial-step01
+        -D PROGRAM=tutorial-step10-test
         -D WORK_DIR=${CMAKE_CURRENT_BINARY_DIR}/tutorial-alone
         -D CXX_COMPILER=${CMAKE_CXX_COMPILER}
         -P ${PROJECT_SOURCE_DIR}/tests/quickstart/alone.cmake)
