@@ -77,7 +77,7 @@ void domains()
 
     viewLayer.setActiveDomain(DomainViewLayer::Camera);
     request("A note, over the camera.", new PopupEvent("media/note", "Now: Bay Jazz"));
-    request("A message, over the camera.", new PopupEvent("phone/message", "Anna writes"));
+    request("A message, over the camera.", new PopupEvent("phone/message", "See you at six"));
     say("The camera goes.");
     viewLayer.setActiveDomain(DomainViewLayer::Other);
     QCoreApplication::sendPostedEvents();

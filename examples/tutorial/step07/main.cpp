@@ -30,7 +30,7 @@ static void buildFlow()
 
 static void callAndVolume()
 {
-    request("A call comes in.", new PopupEvent("phone/call", "Anna"));
+    request("A call comes in.", new PopupEvent("phone/call", "Office"));
     request("Louder.", new PopupEvent("audio/volume", 12));
     request("The volume is dismissed.", new PopupEvent("audio/volume_Dismiss", QVariant()));
     request("The call is taken.", new PopupEvent("phone/call_Dismiss", QVariant()));
@@ -54,6 +54,6 @@ int main(int argc, char *argv[])
 
     say("--- The other way round");
     request("Louder.", new PopupEvent("audio/volume", 13));
-    request("A call comes in.", new PopupEvent("phone/call", "Ben"));
+    request("A call comes in.", new PopupEvent("phone/call", "Garage"));
     request("The call is taken.", new PopupEvent("phone/call_Dismiss", QVariant()));
 }
