@@ -1,7 +1,7 @@
 #pragma once
 
-#include "scenario/commands.h"
 #include "random/seeds.h"
+#include "scenario/commands.h"
 
 #include <QStringList>
 #include <QVariant>
