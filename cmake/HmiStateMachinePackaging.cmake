@@ -4,13 +4,11 @@
 set(HMISTATEMACHINE_PACKAGE_MAINTAINER "HmiStateMachine developers <developers@hmistatemachine.example>"
     CACHE STRING "Who answers for the Debian packages: name <address>")
 
-# The guide, and the reference where it was built.
+# The guide; docs/api brings the reference of the classes, where it was built.
+file(GLOB guide CONFIGURE_DEPENDS docs/*.md)
 install(FILES README.md CHANGELOG.md DESTINATION ${CMAKE_INSTALL_DOCDIR} COMPONENT documentation)
-install(DIRECTORY docs DESTINATION ${CMAKE_INSTALL_DOCDIR} COMPONENT documentation
-    FILES_MATCHING PATTERN *.md PATTERN *.png PATTERN *.svg
-    PATTERN api EXCLUDE)
-install(DIRECTORY ${PROJECT_BINARY_DIR}/docs/html/
-    DESTINATION ${CMAKE_INSTALL_DOCDIR}/html COMPONENT documentation OPTIONAL)
+install(FILES ${guide} DESTINATION ${CMAKE_INSTALL_DOCDIR}/docs COMPONENT documentation)
+install(DIRECTORY docs/images DESTINATION ${CMAKE_INSTALL_DOCDIR}/docs COMPONENT documentation)
 
 set(CPACK_GENERATOR DEB)
 set(CPACK_PACKAGE_NAME hmistatemachine)
