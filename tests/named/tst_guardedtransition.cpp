@@ -41,6 +41,7 @@ private Q_SLOTS:
     void theGuardIsAskedAboutTheEntryItself();
     void anAllowingTransitionFiresOnEntryAtOnce();
     void withoutATargetItIsNotTakenOnEntry();
+    void losingItsTargetAgainIsReportedAgain();
     void withoutATargetItStillReactsToEvents();
     void withWarningsOffItIsNotTakenEither();
     void anUnnamedSourceIsWarnedOfWithoutAName();
@@ -345,6 +346,27 @@ void tst_GuardedTransition::withoutATargetItIsNotTakenOnEntry()
     QCOMPARE(messages().take(),
              QStringList{"warning eventTest: Eventless transition without a target is not taken, "
                          "source state: \"RadioHome\""});
+}
+
+void tst_GuardedTransition::losingItsTargetAgainIsReportedAgain()
+{
+    Regions regions({"Radio"});
+    auto *transition = new GuardedTransition(regions.home("Radio"));
+    transition->setAllowTransitionDefault(true);
+    const QString warning =
+        "warning eventTest: Eventless transition without a target is not taken, "
+        "source state: \"RadioHome\"";
+    regions.start();
+    QCOMPARE(messages().take(), QStringList(warning));
+    transition->setTargetState(regions.away("Radio"));
+    regions.post(new QEvent(QEvent::User));
+    QCOMPARE(regions.active(), QStringList{"RadioAway"});
+
+    transition->setTargetState(nullptr);
+    regions.comeBack("Radio");
+
+    QCOMPARE(regions.active(), QStringList{"RadioHome"});
+    QCOMPARE(messages().take(), QStringList(warning));
 }
 
 void tst_GuardedTransition::withoutATargetItStillReactsToEvents()
