@@ -16,8 +16,8 @@ PARTS = ["CMakeLists.txt", "CMakePresets.json", "cmake", "platform", "src", "tes
 LABELS = "^(flows|hmi|internal|named|popup|random)$"
 MEMORY = 4 << 30 # bytes for a test that has gone wild
 STEPS = "2000" # of each random test: they all take part in each mutation that survives
-# "12/66 Test  #3: name .....***Timeout  30.01 sec"
-FAILED_TEST = re.compile(r"^ *\d+/\d+ Test +#\d+: (\S+) \.*\*\*\*(\w+)", re.MULTILINE)
+# "12/66 Test  #3: name .....***Timeout  30.01 sec", also "name ...Subprocess aborted***Exception: "
+FAILED_TEST = re.compile(r"^ *\d+/\d+ Test +#\d+: (\S+) [^*\n]*\*\*\*(\w+)", re.MULTILINE)
 
 
 class Failure:
