@@ -1,21 +1,20 @@
 #include <HmiStateMachineQuick/quickviewstatetarget.h>
 
-#include <QQmlExtensionPlugin>
+#include <QQmlEngineExtensionPlugin>
 
-/** Lets programs that are not linked to the library import the module: viewers, designers, tests.
+/**
+ * Lets programs that are not linked to the library import the module: viewers, designers, tests.
+ *
+ * Loaded into one that is linked to it, it finds the types registered. Qt takes that from a plugin
+ * that extends engines, and refuses one that registers types.
  */
-class HmiStateMachinePlugin : public QQmlExtensionPlugin
+class HmiStateMachinePlugin : public QQmlEngineExtensionPlugin
 {
     Q_OBJECT
-    Q_PLUGIN_METADATA(IID QQmlExtensionInterface_iid)
+    Q_PLUGIN_METADATA(IID QQmlEngineExtensionInterface_iid)
 
 public:
-    void registerTypes(const char *uri) override
-    {
-        Q_ASSERT(QLatin1String(uri) == QLatin1String("HmiStateMachine"));
-        Q_UNUSED(uri)
-        HmiStateMachine::QuickViewStateTarget::registerQmlModule();
-    }
+    HmiStateMachinePlugin() { HmiStateMachine::QuickViewStateTarget::registerQmlModule(); }
 };
 
 #include "plugin.moc"
