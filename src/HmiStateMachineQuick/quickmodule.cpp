@@ -9,6 +9,7 @@
 #include <HmiStateMachineQuick/internal/log.h>
 
 #include <QQmlEngine>
+#include <QQmlModuleRegistration>
 
 // A static library's resources are not known to the process by themselves.
 static void initResources()
@@ -59,16 +60,8 @@ QObject *provideRequests(QQmlEngine *engine, QJSEngine *)
     return lend(targetFor(engine)->requests());
 }
 
-} // namespace
-
-void QuickViewStateTarget::registerQmlModule()
+void registerTypes()
 {
-    static bool registered = false;
-    if (registered) {
-        return;
-    }
-    registered = true;
-    initResources();
     const QString notMade = QStringLiteral("belongs to ViewTarget");
     qmlRegisterSingletonType<QuickViewStateTarget>(uri, major, minor, "ViewTarget", provideTarget);
     qmlRegisterSingletonType<Requests>(uri, major, minor, "Requests", provideRequests);
@@ -80,6 +73,16 @@ void QuickViewStateTarget::registerQmlModule()
     qmlRegisterType<ViewComponent>(uri, major, minor, "ViewComponent");
     qmlRegisterType<PopupComponent>(uri, major, minor, "PopupComponent");
     qmlRegisterAnonymousType<HostAttached>(uri, major);
+}
+
+} // namespace
+
+void QuickViewStateTarget::registerQmlModule()
+{
+    initResources();
+    // Qt registers the types at the first import. Registered before, they would make it refuse the
+    // plugin of an installed module, which it loads into linked programs, too.
+    static const QQmlModuleRegistration registration(uri, major, registerTypes);
 }
 
 } // namespace HmiStateMachine

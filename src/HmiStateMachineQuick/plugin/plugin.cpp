@@ -2,11 +2,7 @@
 
 #include <QQmlEngineExtensionPlugin>
 
-/**
- * Lets programs that are not linked to the library import the module: viewers, designers, tests.
- *
- * Loaded into one that is linked to it, it finds the types registered. Qt takes that from a plugin
- * that extends engines, and refuses one that registers types.
+/** Lets programs that are not linked to the library import the module: viewers, designers, tests.
  */
 class HmiStateMachinePlugin : public QQmlEngineExtensionPlugin
 {

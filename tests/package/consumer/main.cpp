@@ -1,7 +1,7 @@
+#include <HmiStateMachine/hmistatemachine_version.h>
 #include <HmiStateMachine/HmiViewEvent>
 #include <HmiStateMachine/HmiViewState>
 #include <HmiStateMachine/StateMachine>
-#include <HmiStateMachine/hmistatemachine_version.h>
 
 #include <QCoreApplication>
 #include <QMetaType>
