@@ -42,7 +42,7 @@ namespace {
 class UpdateView : public HmiFallbackViewState
 {
 public:
-    UpdateView(QState *parent) : HmiFallbackViewState("Update", "Home", parent) { }
+    explicit UpdateView(QState *parent) : HmiFallbackViewState("Update", "Home", parent) { }
 
     bool permitted() override { return m_permitted; }
     void setPermitted(bool permitted)

@@ -7,4 +7,4 @@ target_sources(tst_lifetime PRIVATE
     random/seeds.cpp
     random/seeds.h)
 target_include_directories(tst_lifetime PRIVATE lifetime ${CMAKE_CURRENT_SOURCE_DIR})
-set_tests_properties(lifetime PROPERTIES TIMEOUT 120)
+set_tests_properties(lifetime PROPERTIES TIMEOUT 120 ENVIRONMENT "${HMI_LOST_EVENTS}")

@@ -19,7 +19,7 @@ namespace {
 // what it points to.
 QVector<ViewStateTarget *> &existingTargets()
 {
-    static QVector<ViewStateTarget *> targets;
+    static QVector<ViewStateTarget *> targets; // cppcheck-suppress unassignedVariable; others do
     return targets;
 }
 
